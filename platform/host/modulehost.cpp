@@ -24,7 +24,9 @@ void processUntilIdle()
     }
 }
 
-ModuleHost::ModuleHost(QObject *parent) : QObject(parent) { }
+ModuleHost::ModuleHost(QObject *parent)
+    : QObject(parent)
+{ }
 
 ModuleHost::~ModuleHost()
 {
@@ -48,9 +50,9 @@ bool ModuleHost::load(const QString &pluginFile)
     QObject *instance = m_loader.instance();
     m_module = qobject_cast<Taldris::ModuleInterface *>(instance);
     if (!m_module) {
-        m_error = instance ? QStringLiteral("%1 does not implement the module interface")
-                                     .arg(pluginFile)
-                           : m_loader.errorString();
+        m_error = instance
+                ? QStringLiteral("%1 does not implement the module interface").arg(pluginFile)
+                : m_loader.errorString();
         return false;
     }
     return true;

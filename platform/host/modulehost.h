@@ -12,8 +12,9 @@ class HmiState;
 class HmiViewState;
 } // namespace Quorvel
 
+#include <taldris/hmimoduleintegration.h>
+
 namespace Taldris {
-class HmiModuleIntegration;
 class ModuleInterface;
 } // namespace Taldris
 

@@ -22,8 +22,7 @@ namespace {
 
 const char QmlUri[] = "HmiPhone";
 
-template<typename T>
-void registerUncreatable(const char *qmlName)
+template<typename T> void registerUncreatable(const char *qmlName)
 {
     qmlRegisterUncreatableType<T>(QmlUri, 1, 0, qmlName,
                                   QLatin1String(qmlName) + QLatin1String(" is not creatable"));
@@ -109,7 +108,8 @@ Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiSta
     Q_UNUSED(parent)
     Quorvel::HmiState *rootComponent = nullptr;
     if (rootComponent)
-        Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(), 2);
+        Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
+                                                                    2);
     return rootComponent;
 }
 

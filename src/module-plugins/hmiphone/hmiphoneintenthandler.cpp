@@ -47,7 +47,8 @@ QString eventForAction(int action)
 } // namespace
 
 HmiPhoneIntentHandler::HmiPhoneIntentHandler(HmiPhoneController *controller, QObject *parent)
-    : Taldris::HmiIntentHandler(parent), m_controller(controller)
+    : Taldris::HmiIntentHandler(parent)
+    , m_controller(controller)
 {
     for (int action : {CallNumber, AddPhone, StatusBarAlerts, SiriNotEnabled, PhoneRoot,
                        PhoneBookStatusCheck, PhoneSettings, ManageContactsSettings})
