@@ -9,7 +9,9 @@ namespace Taldris {
 
 HmiSubmoduleProvider::HmiSubmoduleProvider(QObject *parent)
     : QObject(parent)
-{ }
+{
+    qRegisterMetaType<Quorvel::HmiState *>();
+}
 
 HmiSubmoduleProvider *HmiSubmoduleProvider::instance()
 {
