@@ -12,9 +12,10 @@ class HmiEvent : public QEvent
 {
 public:
     explicit HmiEvent(const QString &name, const QVariant &value = QVariant())
-        : QEvent(eventType()), m_name(name), m_value(value)
-    {
-    }
+        : QEvent(eventType())
+        , m_name(name)
+        , m_value(value)
+    { }
 
     static QEvent::Type eventType()
     {

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <QPointer>
+#include <QString>
+
+class QAbstractState;
+
+namespace Brisken {
+
+// A popup dismissal made once and run each time: connect it as a functor to a signal, or run it
+// at once. Running it asks the view controller to dismiss the popup.
+class DismissPopup
+{
+public:
+    DismissPopup(const QString &viewId);
+    DismissPopup(QAbstractState *popupState);
+
+    void run() const;
+    void operator()() const { run(); }
+
+    QString viewId() const;
+
+private:
+    QString m_viewId;
+    bool m_fromState;
+    QPointer<QAbstractState> m_popupState;
+};
+
+} // namespace Brisken

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <QStringList>
+#include <QVariant>
+
+namespace Brisken {
+
+// The GUI framework's view controller: the module's direct requests for views, popups and back
+// navigation. Each request is recorded in the platform journal ("view-request", "popup-request",
+// "popup-dismiss", "back") and handed to the HMI state machine, which shows what the states
+// allow (journal "view", "popup-shown", "popup-hidden").
+class ViewController : public QObject
+{
+    Q_OBJECT
+public:
+    static ViewController *instance();
+
+    // Shows the popup state of that name when one is installed and its layer is active; a
+    // request for an identifier that no popup state carries is only recorded.
+    void requestPopup(const QString &viewId, const QVariant &data = QVariant());
+    // Removes the popup from its stack wherever it is; the next one still requested shows.
+    void dismissPopup(const QString &viewId);
+    // Enters the state of that name, or the view state showing that view.
+    void showView(const QVariant &viewId, const QVariant &data = QVariant(), bool flag = false,
+                  const QVariant &extra = QVariant());
+    // Goes back `steps` views in the back stack of the views shown.
+    void back(int steps = 1);
+
+    // Queries for the host and tests.
+    QString activeView() const; // the view identifier on screen, or empty
+    QStringList shownPopups() const;
+    QStringList backStack() const; // view state names, bottom first
+
+private:
+    explicit ViewController(QObject *parent = nullptr);
+};
+
+} // namespace Brisken

@@ -1,0 +1,7 @@
+#include "hmitargetfilter.h"
+
+namespace Quorvel {
+
+HmiTargetFilter::~HmiTargetFilter() = default;
+
+} // namespace Quorvel

@@ -1,0 +1,117 @@
+#include "popupstate.h"
+#include "statemachine_p.h"
+
+#include "hmilayeredstate.h"
+
+#include <QAbstractTransition>
+#include <QTimer>
+
+namespace Quorvel {
+
+PopupState::PopupState(const QString &viewId, int priority)
+    : PopupState(viewId, nullptr, priority)
+{ }
+
+PopupState::PopupState(const QString &viewId, HmiLayeredState *layer, int priority)
+    : HmiState(viewId, layer ? layer->layerState() : nullptr)
+    , m_priority(priority)
+    , m_layer(layer)
+    , m_timer(new QTimer(this))
+{
+    m_timer->setSingleShot(true);
+    connect(m_timer, &QTimer::timeout, this, [this] {
+        if (StateMachinePrivate *d = StateMachinePrivate::existing())
+            d->dismissPopupNow(this);
+    });
+    StateMachinePrivate::get()->registerPopup(this);
+}
+
+PopupState::~PopupState()
+{
+    if (StateMachinePrivate *d = StateMachinePrivate::existing())
+        d->forgetPopup(this);
+}
+
+QString PopupState::viewId() const
+{
+    return objectName();
+}
+
+int PopupState::priority() const
+{
+    return m_priority;
+}
+
+HmiLayeredState *PopupState::layer() const
+{
+    return m_layer;
+}
+
+QVariant PopupState::popupData() const
+{
+    return m_data;
+}
+
+void PopupState::setAutoDismissTimeoutActive(bool active)
+{
+    m_autoDismiss = active;
+    if (!active)
+        m_timer->stop();
+}
+
+bool PopupState::autoDismissTimeoutActive() const
+{
+    return m_autoDismiss;
+}
+
+void PopupState::setAutoDismissTimeoutInterval(int milliseconds)
+{
+    m_autoDismissInterval = milliseconds;
+    m_timer->setInterval(milliseconds);
+}
+
+int PopupState::autoDismissTimeoutInterval() const
+{
+    return m_autoDismissInterval;
+}
+
+void PopupState::restartAutoDismissTimer()
+{
+    if (m_autoDismiss && m_autoDismissInterval > 0 && isActive())
+        m_timer->start();
+}
+
+void PopupState::registerDismissingTransition(QAbstractTransition *transition)
+{
+    if (!transition)
+        return;
+    connect(transition, &QAbstractTransition::triggered, this, [this] {
+        if (StateMachinePrivate *d = StateMachinePrivate::existing())
+            d->dismissPopupNow(this);
+    });
+}
+
+void PopupState::registerDismissingPopup(PopupState *popup)
+{
+    if (popup && popup != this)
+        popup->m_dismissesWhenShown.append(this);
+}
+
+void PopupState::onEntry(QEvent *event)
+{
+    HmiState::onEntry(event);
+    if (m_autoDismiss && m_autoDismissInterval > 0)
+        m_timer->start();
+    if (StateMachinePrivate *d = StateMachinePrivate::existing())
+        d->popupEntered(this);
+}
+
+void PopupState::onExit(QEvent *event)
+{
+    HmiState::onExit(event);
+    m_timer->stop();
+    if (StateMachinePrivate *d = StateMachinePrivate::existing())
+        d->popupExited(this);
+}
+
+} // namespace Quorvel
