@@ -174,8 +174,10 @@ void TestContacts::entry_data()
             << (dismissAllButDownloading + QStringList{QStringLiteral("+PhoneBookDownloading")})
             << 0;
     QTest::addRow("downloaded") << 1 << true << true << "PhoneBookListViewState" << dismissAll << 1;
-    QTest::addRow("status 7 counts as downloaded")
-            << 7 << false << true << "PhoneBookListViewState" << dismissAll << 1;
+    // Only 1 and 2 count as a phonebook for the popups.
+    QTest::addRow("status 7, auto download off")
+            << 7 << false << true << "PhoneBookListViewState"
+            << QStringList{QStringLiteral("+PhoneBookAutoDownload")} << 1;
     QTest::addRow("no list, auto download off")
             << 0 << false << true << "PhoneBookEmptyViewState"
             << QStringList{QStringLiteral("+PhoneBookAutoDownload")} << 0;
@@ -232,21 +234,22 @@ void TestContacts::statusChangesWhileShown_data()
     QTest::addColumn<QStringList>("requests");
     QTest::addColumn<QString>("view");
 
+    const QString waiting = QStringLiteral("PhoneBookWaitingForResponseFromPhone");
     QTest::addRow("download finishes")
             << QList<int>{2, 1} << QStringList{QStringLiteral("PhoneBookDownloading")}
             << "PhoneBookListViewState";
     QTest::addRow("failed twice") << QList<int>{5, 2, 5}
-                                  << QStringList{QStringLiteral("PhoneBookDownloadFailed"),
-                                                 QStringLiteral("PhoneBookDownloading"),
+                                  << QStringList{waiting, QStringLiteral("PhoneBookDownloadFailed"),
+                                                 QStringLiteral("PhoneBookDownloading"), waiting,
                                                  QStringLiteral("PhoneBookDownloadFailedAgain")}
                                   << "PhoneBookEmptyViewState";
     QTest::addRow("failed again after a download")
             << QList<int>{5, 1, 5}
-            << QStringList{QStringLiteral("PhoneBookDownloadFailed"),
+            << QStringList{waiting, QStringLiteral("PhoneBookDownloadFailed"), waiting,
                            QStringLiteral("PhoneBookDownloadFailedAgain")}
             << "PhoneBookEmptyViewState";
     QTest::addRow("downloaded list emptied")
-            << QList<int>{1, 3} << QStringList() << "PhoneBookEmptyViewState";
+            << QList<int>{1, 3} << QStringList{waiting} << "PhoneBookEmptyViewState";
 }
 
 // While the contacts are shown, each status change chooses the view and the popups again; the

@@ -14,6 +14,7 @@
 #include <quorvel/hmiviewstate.h>
 #include <quorvel/popupstate.h>
 
+#include <QEvent>
 #include <QStringList>
 
 namespace HmiPhone {
@@ -95,9 +96,12 @@ PhoneBook_Cmp::PhoneBook_Cmp(HmiPhoneIntegration *integration, const QString &na
     detailsReady->setTargetState(m_contactDetailsView);
 
     // Every status change while the contacts are shown chooses the view and the popups again.
+    // The change stays inside the contacts: as an external transition it would leave the whole
+    // component and tell the phone that the driver left the phonebook at every status change.
     auto *statusChanged = new Quorvel::GuardedPropertyTransition(m_phoneSource, "phoneBookStatus",
                                                                  exclusiveState());
     statusChanged->setAllowTransitionDefault(true);
+    statusChanged->setTransitionType(QAbstractTransition::InternalTransition);
     statusChanged->setTargetState(m_conditionalState);
 
     auto *waitingForResponse = new Quorvel::HmiTransition(

@@ -13,6 +13,8 @@
 #include <quorvel/hmiviewstate.h>
 #include <quorvel/popupstate.h>
 
+#include <QEvent>
+
 namespace HmiPhone {
 
 namespace {
