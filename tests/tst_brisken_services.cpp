@@ -5,11 +5,22 @@
 
 #include <brisken/conditionalshowtransientorpopuprequest.h>
 #include <brisken/datastore.h>
+#include <brisken/dismisspopup.h>
 #include <brisken/hidetransientrequest.h>
 #include <brisken/hmiaction.h>
+#include <brisken/modulecontroller.h>
+#include <brisken/popuputils.h>
+#include <brisken/requestpopup.h>
+#include <brisken/requestview.h>
 #include <brisken/showtransientorpopuprequest.h>
 #include <brisken/statusbarcontroller.h>
+#include <brisken/viewcontroller.h>
 #include <brisken/viewmanager.h>
+#include <quorvel/hmievent.h>
+#include <quorvel/hmitransition.h>
+#include <quorvel/hmiviewstate.h>
+#include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
 
 #include <QRegularExpression>
 #include <QSignalSpy>
@@ -44,6 +55,37 @@ QStringList outputs(qint64 since)
     return lines;
 }
 
+// A running machine with one screen, two global popups and a source-less transition on "Fire".
+struct Machine
+{
+    Machine()
+    {
+        machine = Quorvel::StateMachine::instance();
+        auto *home = new Quorvel::HmiViewState(QStringLiteral("T.Home"), QStringLiteral("Home"),
+                                               machine->screensState());
+        machine->screensState()->setInitialHmiState(home);
+        first = new Quorvel::PopupState(QStringLiteral("T.First"), 1);
+        second = new Quorvel::PopupState(QStringLiteral("T.Second"), 1);
+        fire = new Quorvel::HmiTransition(QStringLiteral("Fire"));
+        QObject::connect(fire, &QAbstractTransition::triggered, [this] { ++fired; });
+        machine->installRootHierarchy(
+                {{Quorvel::StateLevel3, fire}},
+                {{Quorvel::StateLevel3, first}, {Quorvel::StateLevel3, second}});
+    }
+    ~Machine() { Quorvel::StateMachine::destroyInstance(); }
+    void start()
+    {
+        machine->start();
+        TestSupport::processUntilIdle();
+    }
+
+    Quorvel::StateMachine *machine;
+    Quorvel::PopupState *first;
+    Quorvel::PopupState *second;
+    Quorvel::HmiTransition *fire;
+    int fired = 0;
+};
+
 } // namespace
 
 class TestBriskenServices : public QObject
@@ -58,6 +100,12 @@ private slots:
     void transientRequests_data();
     void transientRequests();
     void actionEnabledBinding();
+    void moduleControllerPostsLater_data();
+    void moduleControllerPostsLater();
+    void moduleControllerViewController();
+    void popupAndViewRequests_data();
+    void popupAndViewRequests();
+    void makeExclusiveClosesPopups();
 };
 
 void TestBriskenServices::viewIdentifier()
@@ -174,6 +222,137 @@ void TestBriskenServices::actionEnabledBinding()
     QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("No such signal")));
     QTest::ignoreMessage(QtCriticalMsg, QRegularExpression(QStringLiteral("cannot bind")));
     QVERIFY(!action.enabledBinding(&sender, SIGNAL(noSuchSignal(bool))));
+}
+
+void TestBriskenServices::moduleControllerPostsLater_data()
+{
+    QTest::addColumn<bool>("startFirst");
+    QTest::addRow("running machine") << true;
+    QTest::addRow("posted before the machine starts") << false;
+}
+
+void TestBriskenServices::moduleControllerPostsLater()
+{
+    QFETCH(bool, startFirst);
+    Machine machine;
+    if (startFirst)
+        machine.start();
+    Brisken::ModuleController controller;
+    const qint64 since = Journal::instance()->lastSequence();
+
+    controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 42));
+    controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("fire")));
+
+    QCOMPARE(machine.fired, 0);
+    QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), since),
+             (QStringList{QStringLiteral("Fire"), QStringLiteral("fire")}));
+    QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("value"), since)
+                     .first(),
+             QStringLiteral("42"));
+    if (!startFirst)
+        machine.start();
+    TestSupport::processUntilIdle();
+    QCOMPARE(machine.fired, 1);
+    QCOMPARE(machine.fire->transitionData(), QVariant(42));
+}
+
+void TestBriskenServices::moduleControllerViewController()
+{
+    Brisken::ModuleController controller;
+    QCOMPARE(controller.viewController(), Brisken::ViewController::instance());
+    controller.setViewController(nullptr);
+    QVERIFY(!controller.viewController());
+}
+
+using RequestFactory = std::function<void(QObject *trigger, Quorvel::PopupState *popup)>;
+Q_DECLARE_METATYPE(RequestFactory)
+
+void TestBriskenServices::popupAndViewRequests_data()
+{
+    QTest::addColumn<RequestFactory>("connectRequest");
+    QTest::addColumn<QStringList>("journal");
+    const auto rows = QList<std::tuple<const char *, RequestFactory, QStringList>>{
+            {"request popup by state",
+             [](QObject *trigger, Quorvel::PopupState *popup) {
+                 QObject::connect(trigger, &QObject::objectNameChanged,
+                                  Brisken::RequestPopup(popup, QVariant()));
+             },
+             {QStringLiteral("popup-request:T.First")}},
+            {"dismiss popup by identifier",
+             [](QObject *trigger, Quorvel::PopupState *) {
+                 QObject::connect(trigger, &QObject::objectNameChanged,
+                                  Brisken::DismissPopup(QStringLiteral("T.First")));
+             },
+             {QStringLiteral("popup-dismiss:T.First")}},
+            {"view by state name",
+             [](QObject *trigger, Quorvel::PopupState *) {
+                 QObject::connect(trigger, &QObject::objectNameChanged,
+                                  Brisken::RequestView(Quorvel::NamedState::stateForName(
+                                          QStringLiteral("Home"))));
+             },
+             {QStringLiteral("view-request:Home")}},
+            {"transient or popup, status bar hidden",
+             [](QObject *trigger, Quorvel::PopupState *) {
+                 sharedStatusBar()->setStatusBarVisible(false);
+                 QObject::connect(trigger, &QObject::objectNameChanged,
+                                  Brisken::ShowTransientOrPopupRequest(sharedStatusBar(),
+                                                                       QStringLiteral("Note"),
+                                                                       QStringLiteral("T.Second")));
+             },
+             {QStringLiteral("popup-request:T.Second")}},
+            {"transient or popup, no status bar",
+             [](QObject *trigger, Quorvel::PopupState *) {
+                 QObject::connect(trigger, &QObject::objectNameChanged,
+                                  Brisken::ShowTransientOrPopupRequest(nullptr,
+                                                                       QStringLiteral("Note"),
+                                                                       QStringLiteral("T.Second")));
+             },
+             {QStringLiteral("popup-request:T.Second")}}};
+    for (const auto &row : rows)
+        QTest::newRow(std::get<0>(row)) << std::get<1>(row) << std::get<2>(row);
+}
+
+void TestBriskenServices::popupAndViewRequests()
+{
+    QFETCH(RequestFactory, connectRequest);
+    QFETCH(QStringList, journal);
+    Machine machine;
+    machine.start();
+    QObject trigger;
+    connectRequest(&trigger, machine.first);
+    const qint64 since = Journal::instance()->lastSequence();
+
+    // Built once, the request runs each time its signal fires.
+    trigger.setObjectName(QStringLiteral("once"));
+    trigger.setObjectName(QStringLiteral("twice"));
+
+    QStringList requests;
+    for (const QString &line : outputs(since)) {
+        if (line.contains(QLatin1String("request")) || line.contains(QLatin1String("dismiss")))
+            requests.append(line);
+    }
+    QCOMPARE(requests, journal + journal);
+}
+
+void TestBriskenServices::makeExclusiveClosesPopups()
+{
+    Machine machine;
+    machine.start();
+    auto *other = new Quorvel::HmiTransition(QStringLiteral("Other"));
+    machine.machine->installRootHierarchy({{Quorvel::StateLevel3, other}}, {});
+    Brisken::PopupUtils::makeExclusive(machine.fire, QList<Quorvel::PopupState *>{machine.first});
+    Brisken::PopupUtils::makeExclusive(other, {machine.second});
+    Brisken::ViewController *views = Brisken::ViewController::instance();
+    views->requestPopup(QStringLiteral("T.First"));
+    views->requestPopup(QStringLiteral("T.Second"));
+    TestSupport::processUntilIdle();
+
+    machine.machine->postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire")));
+    TestSupport::processUntilIdle();
+
+    QCOMPARE(views->shownPopups(), QStringList{QStringLiteral("T.Second")});
+    QCOMPARE(machine.machine->popupStack(QStringLiteral("T.First")),
+             QStringList{QStringLiteral("T.Second")});
 }
 
 QTEST_GUILESS_MAIN(TestBriskenServices)

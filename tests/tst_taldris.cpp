@@ -3,15 +3,19 @@
 
 #include "testsupport.h"
 
+#include <quorvel/hmistate.h>
 #include <taldris/hardkeycontroller.h>
+#include <taldris/hmihostedsubmodule.h>
 #include <taldris/hmiintenthandler.h>
 #include <taldris/hmiintentmanager.h>
 #include <taldris/hmiintentrequest.h>
 #include <taldris/hmimoduleintegration.h>
+#include <taldris/hmisubmoduleprovider.h>
 #include <taldris/intentactionrequest.h>
 #include <taldris/moduleinterface.h>
 #include <taldris/pellumcategory.h>
 
+#include <QRegularExpression>
 #include <QSignalSpy>
 #include <QTest>
 
@@ -54,6 +58,20 @@ public:
     using Taldris::HmiModuleIntegration::HmiModuleIntegration;
     QString moduleName() const override { return QStringLiteral("Test"); }
     Quorvel::HmiState *createScreenStateSubTree(Quorvel::HmiState *) override { return nullptr; }
+};
+
+class Submodule : public Taldris::HmiHostedSubmodule
+{
+public:
+    Brisken::HmiAction *subModuleEntryAction() override { return nullptr; }
+    QString moduleIdentifier() const override { return QStringLiteral("TEST"); }
+    QString submoduleName() const override { return QStringLiteral("Test submodule."); }
+    QString viewDescriptorFile() const override { return QString(); }
+    Quorvel::HmiState *createStateHierarchy(Quorvel::HmiState *parent) override
+    {
+        return new Quorvel::HmiState(QStringLiteral("Hosted%1").arg(++built), parent);
+    }
+    int built = 0;
 };
 
 class Plugin : public QObject, public Taldris::ModuleInterface
@@ -102,6 +120,8 @@ private slots:
     void actionStatus();
     void requestObjectsRunEachTime();
     void intentActionRequestProvider();
+    void submoduleProvider_data();
+    void submoduleProvider();
     void hardKeyFallBacks_data();
     void hardKeyFallBacks();
     void pellumCategoryLevel_data();
@@ -236,6 +256,50 @@ void TestTaldris::intentActionRequestProvider()
     QTest::ignoreMessage(QtWarningMsg, "IntentActionRequest: data provider of action 7 is gone");
     QVERIFY(!request.run());
     QVERIFY(intents(since).isEmpty());
+}
+
+void TestTaldris::submoduleProvider_data()
+{
+    QTest::addColumn<QString>("steps");
+    QTest::addColumn<int>("built");
+    // "offer", "request", "drop-host" (the host state is destroyed), "drop-submodule".
+    QTest::addRow("offered, then requested") << QStringLiteral("offer request") << 1;
+    QTest::addRow("requested, then offered") << QStringLiteral("request offer") << 1;
+    QTest::addRow("host state gone before the offer")
+            << QStringLiteral("request drop-host offer") << 0;
+    QTest::addRow("submodule gone before the request")
+            << QStringLiteral("offer drop-submodule request") << 0;
+}
+
+void TestTaldris::submoduleProvider()
+{
+    QFETCH(QString, steps);
+    QFETCH(int, built);
+    static int id = 100; // a fresh id per row: the provider is process-wide
+    ++id;
+    auto *provider = Taldris::HmiSubmoduleProvider::instance();
+    QSignalSpy created(provider, &Taldris::HmiSubmoduleProvider::submoduleCreated);
+    auto host = std::make_unique<Quorvel::HmiState>(QStringLiteral("Host"));
+    auto submodule = std::make_unique<Submodule>();
+    Submodule *offered = submodule.get();
+    for (const QString &step : steps.split(QLatin1Char(' '))) {
+        if (step == QLatin1String("offer")) {
+            provider->registerHostedSubmodule(id, submodule.get());
+        } else if (step == QLatin1String("request")) {
+            provider->requestSubmodule(id, host.get(), QStringLiteral("TEST"), 2);
+        } else if (step == QLatin1String("drop-host")) {
+            host.reset();
+            QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("is gone")));
+        } else {
+            submodule.reset();
+        }
+    }
+    QCOMPARE(created.size(), built);
+    if (built) {
+        QCOMPARE(offered->built, built);
+        QVERIFY(host->findChild<Quorvel::HmiState *>(QStringLiteral("Hosted1")));
+        QCOMPARE(created.first().at(2).toString(), QStringLiteral("TEST"));
+    }
 }
 
 void TestTaldris::hardKeyFallBacks_data()

@@ -1,5 +1,7 @@
 #include "dismisspopup.h"
 
+#include "viewcontroller.h"
+
 #include <QAbstractState>
 
 namespace Brisken {
@@ -21,6 +23,12 @@ QString DismissPopup::viewId() const
     return m_popupState ? m_popupState->objectName() : QString();
 }
 
-void DismissPopup::run() const { }
+void DismissPopup::run() const
+{
+    // A popup state that is gone cannot be shown: there is nothing to dismiss.
+    const QString view = viewId();
+    if (!view.isEmpty())
+        ViewController::instance()->dismissPopup(view);
+}
 
 } // namespace Brisken

@@ -1,7 +1,8 @@
 #include "hmiaction.h"
 
+#include "briskenlog.h"
+
 #include <QCoreApplication>
-#include <QLoggingCategory>
 
 namespace Brisken {
 
@@ -34,8 +35,8 @@ bool HmiAction::enabledBinding(const QObject *sender, const char *signal)
 {
     const bool bound = sender && signal && connect(sender, signal, this, SLOT(setEnabled(bool)));
     if (!bound)
-        qCritical("HmiAction: cannot bind the enabled state of \"%s\" to %s",
-                  qUtf8Printable(m_name), signal ? signal : "(null)");
+        qCCritical(briskenLog, "HmiAction: cannot bind the enabled state of \"%s\" to %s",
+                   qUtf8Printable(m_name), signal ? signal : "(null)");
     return bound;
 }
 

@@ -1,13 +1,13 @@
 #pragma once
 
+#include <brisken/viewcontroller.h>
+
 #include <QObject>
 #include <QPointer>
 
 class QEvent;
 
 namespace Brisken {
-
-class ViewController;
 
 // Base of a module's controller: posts the module's events to the HMI state machine and holds
 // the view controller through which the module may request views directly.
@@ -20,14 +20,15 @@ public:
     ~ModuleController() override;
 
     // Posts `event` to the HMI state machine, which takes ownership and handles it later, never
-    // inside this call.
+    // inside this call. An event posted while the machine is not running is kept and posted
+    // when it starts.
     void postEvent(QEvent *event);
 
     ViewController *viewController() const;
     void setViewController(ViewController *viewController);
 
 private:
-    QPointer<QObject> m_viewController;
+    QPointer<ViewController> m_viewController;
 };
 
 } // namespace Brisken

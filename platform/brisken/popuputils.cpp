@@ -1,7 +1,10 @@
 #include "popuputils.h"
 
+#include "viewcontroller.h"
+
 #include <QAbstractState>
 #include <QAbstractTransition>
+#include <QPointer>
 
 namespace Brisken {
 
@@ -9,8 +12,20 @@ namespace PopupUtils {
 
 void makeExclusive(QAbstractTransition *transition, const QList<QAbstractState *> &popups)
 {
-    Q_UNUSED(transition)
-    Q_UNUSED(popups)
+    if (!transition)
+        return;
+    QList<QPointer<QAbstractState>> closed;
+    for (QAbstractState *popup : popups) {
+        if (popup)
+            closed.append(popup);
+    }
+    // A popup state is named by its view identifier.
+    QObject::connect(transition, &QAbstractTransition::triggered, transition, [closed] {
+        for (const QPointer<QAbstractState> &popup : closed) {
+            if (popup)
+                ViewController::instance()->dismissPopup(popup->objectName());
+        }
+    });
 }
 
 } // namespace PopupUtils

@@ -1,5 +1,8 @@
 #include "requestpopup.h"
 
+#include "briskenlog.h"
+#include "viewcontroller.h"
+
 #include <QAbstractState>
 
 namespace Brisken {
@@ -23,6 +26,14 @@ QString RequestPopup::viewId() const
     return m_popupState ? m_popupState->objectName() : QString();
 }
 
-void RequestPopup::run() const { }
+void RequestPopup::run() const
+{
+    const QString view = viewId();
+    if (view.isEmpty()) {
+        qCWarning(briskenLog, "RequestPopup: the requested popup state is gone");
+        return;
+    }
+    ViewController::instance()->requestPopup(view, m_data);
+}
 
 } // namespace Brisken

@@ -1,5 +1,8 @@
 #include "requestview.h"
 
+#include "briskenlog.h"
+#include "viewcontroller.h"
+
 #include <QAbstractState>
 
 namespace Brisken {
@@ -29,6 +32,14 @@ QString RequestView::viewId() const
     return m_viewState ? m_viewState->objectName() : QString();
 }
 
-void RequestView::run() const { }
+void RequestView::run() const
+{
+    const QString view = viewId();
+    if (view.isEmpty()) {
+        qCWarning(briskenLog, "RequestView: the requested view state is gone");
+        return;
+    }
+    ViewController::instance()->showView(view, m_data, m_flag, m_extra);
+}
 
 } // namespace Brisken

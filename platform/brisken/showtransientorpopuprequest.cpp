@@ -1,6 +1,7 @@
 #include "showtransientorpopuprequest.h"
 
 #include "statusbarcontroller.h"
+#include "viewcontroller.h"
 
 namespace Brisken {
 
@@ -14,8 +15,11 @@ ShowTransientOrPopupRequest::ShowTransientOrPopupRequest(StatusBarController *st
 
 void ShowTransientOrPopupRequest::run() const
 {
+    // A transient needs a visible status bar; without one the message comes as a popup.
     if (m_statusBar && m_statusBar->statusBarVisible())
         m_statusBar->requestTransientWidget(m_transientName, 0);
+    else
+        ViewController::instance()->requestPopup(m_popupViewId);
 }
 
 } // namespace Brisken

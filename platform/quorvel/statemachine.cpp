@@ -448,10 +448,12 @@ bool StateMachinePrivate::back(int steps)
 {
     if (steps < 1)
         return false;
-    backStack.removeAll(nullptr);
+    // Worked on a copy: nothing changes when there is nothing to go back to.
+    QList<QPointer<HmiViewState>> stack = backStack;
+    stack.removeAll(nullptr);
     HmiViewState *current = activeView;
-    if (current && !backStack.isEmpty() && backStack.last() == current)
-        backStack.removeLast();
+    if (current && !stack.isEmpty() && stack.last() == current)
+        stack.removeLast();
 
     QAbstractState *target = nullptr;
     int remaining = steps;
@@ -462,8 +464,8 @@ bool StateMachinePrivate::back(int steps)
         target = current->backTargetProviderState();
         --remaining;
     }
-    while (remaining > 0 && !backStack.isEmpty()) {
-        HmiViewState *entry = backStack.takeLast();
+    while (remaining > 0 && !stack.isEmpty()) {
+        HmiViewState *entry = stack.takeLast();
         bool accepted = true;
         if (current) {
             for (const QSharedPointer<HmiTargetFilter> &filter : current->backTargetFilters())
@@ -476,6 +478,7 @@ bool StateMachinePrivate::back(int steps)
     }
     if (!target)
         return false;
+    backStack = stack;
     // Going back to a view that names a back-stack state enters that state instead, so that
     // the component can choose its screen again.
     if (auto *view = qobject_cast<HmiViewState *>(target)) {

@@ -3,11 +3,15 @@
 #include "hmihostedsubmodule.h"
 #include "taldrislog.h"
 
+#include <quorvel/hmistate.h>
+
 namespace Taldris {
 
 HmiSubmoduleProvider::HmiSubmoduleProvider(QObject *parent)
     : QObject(parent)
-{ }
+{
+    qRegisterMetaType<Quorvel::HmiState *>();
+}
 
 HmiSubmoduleProvider *HmiSubmoduleProvider::instance()
 {
@@ -19,6 +23,11 @@ void HmiSubmoduleProvider::registerHostedSubmodule(int id, HmiHostedSubmodule *s
 {
     if (!submodule)
         return;
+    if (HmiHostedSubmodule *previous = hostedSubmodule(id); previous && previous != submodule)
+        qCWarning(taldrisLog,
+                  "HmiSubmoduleProvider: submodule %d is offered again; the newer one "
+                  "replaces the older",
+                  id);
     m_submodules.insert(id, submodule);
     const QList<Request> pending = m_pending;
     m_pending.clear();
@@ -38,8 +47,7 @@ HmiHostedSubmodule *HmiSubmoduleProvider::hostedSubmodule(int id) const
 Quorvel::HmiState *HmiSubmoduleProvider::requestSubmodule(int id, Quorvel::HmiState *parent,
                                                           const QString &moduleId, int mode)
 {
-    Request request{id, nullptr, moduleId, mode};
-    Q_UNUSED(parent)
+    Request request{id, parent, moduleId, mode};
     if (HmiHostedSubmodule *submodule = hostedSubmodule(id))
         return create(submodule, request);
     m_pending.append(request);
@@ -49,9 +57,16 @@ Quorvel::HmiState *HmiSubmoduleProvider::requestSubmodule(int id, Quorvel::HmiSt
 Quorvel::HmiState *HmiSubmoduleProvider::create(HmiHostedSubmodule *submodule,
                                                 const Request &request)
 {
-    Q_UNUSED(submodule)
-    Q_UNUSED(request)
-    return nullptr;
+    // The host state is gone: there is nothing to build the submodule under.
+    auto *parent = qobject_cast<Quorvel::HmiState *>(request.parent.data());
+    if (!parent) {
+        qCWarning(taldrisLog, "HmiSubmoduleProvider: the state that asked for submodule %d is gone",
+                  request.id);
+        return nullptr;
+    }
+    Quorvel::HmiState *state = submodule->createStateHierarchy(parent);
+    emit submoduleCreated(request.id, state, request.moduleId);
+    return state;
 }
 
 } // namespace Taldris

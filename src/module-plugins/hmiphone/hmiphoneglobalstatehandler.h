@@ -1,0 +1,326 @@
+#pragma once
+
+#include <quorvel/statelevel.h>
+
+#include <QList>
+#include <QObject>
+#include <QPair>
+#include <QVector>
+
+class QAbstractTransition;
+class QEvent;
+class QTimer;
+
+namespace Quorvel {
+class PopupState;
+class HmiTransition;
+class GuardedSignalTransition;
+class GuardedPropertyTransition;
+class KeySignalTransition;
+} // namespace Quorvel
+
+namespace Brisken {
+class ViewController;
+class ViewManager;
+} // namespace Brisken
+
+namespace Mavrosk {
+class BluetoothSource;
+class PhoneSource;
+class SpeechSource;
+class KeySource;
+class NavSource;
+class ProjectionSource;
+} // namespace Mavrosk
+
+namespace Taldris {
+class HardKeyController;
+} // namespace Taldris
+
+namespace HmiPhone {
+
+class HmiPhoneController;
+class HmiPhonePopupManager;
+class Phone_Cmp;
+
+// The phone's always-armed part of the HMI state machine: the global popup states (incoming and
+// waiting call, call ended, missed call, errors, text-message alerts, ...) and the transitions
+// that react to calls, keys, device and message events whatever screen is shown. They are built
+// once by produceGlobalStateAndTransitions() and handed to the framework's root hierarchy through
+// the two lists; the handler then only reacts through its slots.
+class HmiPhoneGlobalStateHandler : public QObject
+{
+    Q_OBJECT
+public:
+    using TransitionList = QList<QPair<Quorvel::StateLevel, QAbstractTransition *>>;
+    using PopupList = QList<QPair<Quorvel::StateLevel, Quorvel::PopupState *>>;
+
+    HmiPhoneGlobalStateHandler(HmiPhoneController *controller, QObject *parent);
+
+    void produceGlobalStateAndTransitions(HmiPhone::Phone_Cmp *phoneCmp);
+
+    TransitionList rootHierarchyTransitions() const;
+    PopupList rootHierarchyPopups() const;
+
+signals:
+    void transitionFromPhoneManageContactsSettingsStatusChanged(bool);
+
+private slots:
+    // Call reactions
+    void incomingCall();
+    void incomingCallOutbound();
+    void acceptIncomingCall();
+    void rejectIncomingCall();
+    void endCall();
+    void stopAnswering();
+    void showCallEnded();
+    void callEndConfirmed();
+    void redialRequest();
+    void cancelRedialRequest();
+    void handleRoamingWarning();
+    void roamingCallConfirmed();
+    void roamingCallCancelled();
+    void handleDialingFailure();
+    void hideDialingFailed();
+    void hideCallKeyPad();
+    void onMissedCallPopupExited();
+    void addPhoneRequested();
+
+    // Transient messages of the status bar
+    void showPhoneAcceptedCallTransientMessage();
+    void showPhoneRejectedCallTransientMessage();
+    void showPhoneCallEndedTransientMessage();
+    void showPhoneConnectedOutgoingCallTransientMessage();
+    void showPhoneDialingTransientMessage();
+    void hidePhoneDialingTransientMessage();
+    void showPhonebookDownloadInitiatedTransientMessage();
+    void hidePhonePhonebookDownloadInitiatedTransientMessage();
+    void showPhonebookDownloadCompleteTransientMessage();
+
+    // Text-message alert bookkeeping, wired to the alert popups
+    void enableSingleMessageState();
+    void resetAlertStateOnSingleMessageTimeout();
+    void enableMultipleMessagesState();
+    void resetAlertStateOnMultipleMessagesTimeout();
+
+    // Guard tests: each allows or blocks the transition that asks
+    void incomingCallTransitionEventTest(QEvent *event);
+    void incomingCallKeySignalTransitionEventTest(QEvent *event);
+    void missedCallPresentTransitionEventTest(QEvent *event);
+    void incomingCallonPrjDisconnectTransitionEventTest(QEvent *event);
+    void missedCallTransitionEventTest(QEvent *event);
+    void callConnectedTransitionEventTest(QEvent *event);
+    void redialKeyTransitionEventTest(QEvent *event);
+    void phoneKeyTransitionEventTest(QEvent *event);
+    void phoneMultipartySwitchKeyTransitionEventTest(QEvent *event);
+    void phoneEndCallKeyTransitionEventTest(QEvent *event);
+    void isProjectionNotActive();
+    void batteryLevelTransitionEventTest(QEvent *event);
+    void standbyTransitionEventTest(QEvent *event);
+    void showPhoneConnectionLostTest(QEvent *event);
+    void showPhoneAttemptingReconnectTest(QEvent *event);
+    void showPhoneDoorOpenLinklossTest(QEvent *event);
+    void showPhoneDoorNoCallOpenLinklossTest(QEvent *event);
+    void newTextMessageTest(QEvent *event);
+    void multipleNewTextMessagesTest(QEvent *event);
+    void requestedMessageDetailsReadyTest(QEvent *event);
+    void smsNewTextHearitEventTest(QEvent *event);
+    void dtmfKeyPressNoResponseErrorEventTest(QEvent *event);
+    void phoneAudioTransferErrorEventTest(QEvent *event);
+    void phoneAudioHandsfreeErrorEventTest(QEvent *event);
+    void phoneAudioInternalErrorEventTest(QEvent *event);
+    void smsMessagesInMemoryTest(QEvent *event);
+    void smsMessagesNotInMemoryTest(QEvent *event);
+    void smsMessageNotificationEnabledTest(QEvent *event);
+    void smsMessageNotificationNotEnabledTest(QEvent *event);
+
+private:
+    // The places of the global transitions in the root-hierarchy list, in registration order
+    // (level 3 unless marked L2). This order is what the framework sees; transitions are
+    // collected here while they are built, in build order, and listed in this order at the end.
+    enum ListPosition : int {
+        PhoneKeyOpensPhone, // key 12 short press, enters the phone
+        PhoneKeyAcceptsCall, // key 12 short press, accepts a ringing call
+        SendKey79Press,
+        EndKey80Press,
+        StatusBarVisibleChanged, // L2, only with a status-bar controller
+        ShowContactsRequest, // L2
+        AddPhoneRequest,
+        DisplayPairingPopup,
+        EndCallRequest,
+        IncomingCallChanged,
+        IncomingCallEnded,
+        OutgoingConnected3To7,
+        OutgoingConnected4To9,
+        OutgoingConnected5To10,
+        OutgoingConnected6To11,
+        PrivateModeOn,
+        CallConnected,
+        CallConnectedBecomesTrue,
+        AcceptOrSeekKey77Press,
+        PhoneKeyEndsCall, // key 12 long press
+        PhoneKeyRejectsCall, // key 12 long press, rejects a ringing call
+        RejectOrSeekKey78Press,
+        SendKey49Press,
+        EndKey50Press,
+        SwcSeekDownShortPress,
+        SwcSeekUpShortPress,
+        SwcSeekDownLongPress,
+        SwcSeekDownLongRelease,
+        SwcSeekUpLongPress,
+        SwcSeekUpLongRelease,
+        PhoneKeyMultipartySwitch, // key 12 short press
+        PhoneIssueFixRequest,
+        DialingFailed1,
+        DialingFailed0,
+        ConfirmRoamingCall,
+        CancelRoamingCall,
+        DeviceBatteryLevel,
+        ShowStatusBarAlertsRequest,
+        StopAnswering,
+        StandbyStatus,
+        StandbyStatusLeft,
+        NonUserDisconnectCallLost,
+        NonUserDisconnectReconnecting,
+        NewTextMessageSingle,
+        CallAcceptingFailed,
+        NewTextMessageDetailsReady,
+        MakeCallRequest,
+        ShowMessageListRequested,
+        ListenToMessageRequested,
+        TextMessageDetailsReady,
+        NewTextMessageMultiple,
+        ShowReplyMessagesRequested,
+        SmsSendTextMessage,
+        ReplyMessageLineNoChanged,
+        MissedCallsPresent,
+        SmsInitiateSendTextMessage,
+        SendMessageStatus2,
+        SendMessageStatus1,
+        SendMessageStatus3,
+        SendMessageStatus0,
+        SmsRetrySendTextMessage,
+        SendMessageRequested,
+        CancelSendMessageRequested,
+        DialingStatus3,
+        DialingStatus4,
+        MultipartyActiveCallEnded,
+        DtmfNoResponseError,
+        AudioTransferError,
+        ExtendedMode1,
+        PrivacyRequestOn,
+        ExtendedMode2,
+        ExtendedMode3,
+        ExtendedMode0,
+        UnstableConnectionWithKova,
+        DeviceReconnectFail,
+        WaitingCallRemoteRejection,
+        IncomingCallRemoteRejection,
+        AudioHandsfreeError,
+        RoamingModeReceived,
+        SiriNoResponseError,
+        AudioInternalError,
+        ContactsTooLargeError,
+        PhoneBookStatus2To1,
+        PhoneBookStatusBecomes2,
+        PhoneBookStatusLeaves2,
+        ClusterHearItRequest,
+        ClusterIgnoreRequest,
+        DoorOpenLinklossCall,
+        DoorOpenLinklossNoCall,
+        ShowConnectToDevice,
+        DeviceConnectedBecomesTrue,
+        RetryPhnBookDownloadAccessRequest,
+        RetryAutomaticContactDownloadRequest,
+        ClearExtendedModeTimer,
+        ShowSmsNotificationEnabled,
+        ShowSmsNotificationDisabled,
+        ShowSmsStatusInMemory,
+        ShowSmsStatusNotInMemory,
+        RootStateRequest,
+        RoamingModeRequest,
+        ShowSiriNotEnabledRequest,
+        SiriScoChannelNotActive,
+        SiriActiveBecomesTrue, // L2
+        SiriActiveBecomesFalse, // L2
+        VoiceServiceActiveBecomesTrue, // L2
+        VoiceServiceActiveBecomesFalse, // L2
+        DeviceConnectedChanged,
+        PhoneMenuExited, // L2
+        PhoneMenuEntered, // L2
+        RejectIncomingCallRequest,
+        AcceptIncomingCallRequest,
+        ShowSmsIphoneRequest,
+        SendMessageNoResponseFromPhone,
+        ProjectionNotActive,
+        ListPositionCount
+    };
+
+    void list(ListPosition position, QAbstractTransition *transition,
+              Quorvel::StateLevel level = Quorvel::StateLevel3);
+
+    void createPopupStates();
+    void createCallTransitions(Phone_Cmp *phoneCmp);
+    void createScreenRequestTransitions(Phone_Cmp *phoneCmp);
+    void createCallRequestTransitions();
+    void listCollectedTransitions(Phone_Cmp *phoneCmp);
+
+    void requestTransient(const QString &name);
+    void hideTransient(const QString &name);
+    void postEvent(const QString &name);
+
+    HmiPhoneController *m_controller;
+    HmiPhonePopupManager *m_popupManager;
+    Brisken::ViewController *m_viewController;
+    Brisken::ViewManager *m_viewManager;
+    Mavrosk::BluetoothSource *m_bluetoothSource;
+    Mavrosk::PhoneSource *m_phoneSource;
+    Mavrosk::SpeechSource *m_speechSource;
+    Mavrosk::KeySource *m_keySource;
+    Mavrosk::NavSource *m_navSource;
+    Mavrosk::ProjectionSource *m_projectionSource;
+    Taldris::HardKeyController *m_hardKeyController;
+    TransitionList m_rootHierarchyTransitions;
+    PopupList m_rootHierarchyPopups;
+    Quorvel::PopupState *m_incomingCallPopup;
+    Quorvel::PopupState *m_waitingCallPopup;
+    Quorvel::GuardedPropertyTransition *m_incomingCallTransition;
+    Quorvel::GuardedPropertyTransition *m_missedCallTransition;
+    Quorvel::GuardedPropertyTransition *m_callConnectedTransition;
+    Quorvel::GuardedPropertyTransition *m_batteryLevelTransition;
+    Quorvel::GuardedPropertyTransition *m_standbyTransition;
+    Quorvel::GuardedSignalTransition *m_connectionLostTransition;
+    Quorvel::GuardedSignalTransition *m_attemptingReconnectTransition;
+    Quorvel::GuardedSignalTransition *m_doorOpenLinklossTransition;
+    Quorvel::GuardedSignalTransition *m_doorNoCallOpenLinklossTransition;
+    Quorvel::GuardedSignalTransition *m_newTextMessageTransition;
+    Quorvel::GuardedSignalTransition *m_requestedMessageDetailsReadyTransition;
+    Quorvel::GuardedSignalTransition *m_multipleNewTextMessagesTransition;
+    Quorvel::GuardedSignalTransition *m_dtmfNoResponseErrorTransition;
+    Quorvel::GuardedSignalTransition *m_audioTransferErrorTransition;
+    Quorvel::GuardedSignalTransition *m_audioHandsfreeErrorTransition;
+    Quorvel::GuardedSignalTransition *m_audioInternalErrorTransition;
+    Quorvel::GuardedSignalTransition *m_smsNewTextHearItTransition;
+    Quorvel::HmiTransition *m_smsInMemoryTransition;
+    Quorvel::HmiTransition *m_smsNotInMemoryTransition;
+    Quorvel::HmiTransition *m_smsIphoneTransition;
+    Quorvel::GuardedSignalTransition *m_incomingCallOnProjectionDisconnectTransition;
+    Quorvel::KeySignalTransition *m_phoneKeyTransition;
+    Quorvel::KeySignalTransition *m_phoneEndCallKeyTransition;
+    Quorvel::KeySignalTransition *m_multipartySwitchKeyTransition;
+    Quorvel::PopupState *m_newTextMessageAlertPopup;
+    Quorvel::PopupState *m_multipleTextMessagesPopup;
+    bool m_listenMessageRequested;
+    int m_textMessageAlertState;
+    int m_sendMessageRetryCount;
+    int m_dialingFailureCount;
+    QTimer *m_extendedModeTimer;
+    int m_extendedModeMinutesElapsed;
+    Quorvel::HmiTransition *m_smsNotificationDisabledTransition;
+    Quorvel::HmiTransition *m_smsNotificationEnabledTransition;
+
+    // Transitions built but not yet listed, by list position.
+    QVector<QPair<Quorvel::StateLevel, QAbstractTransition *>> m_collectedTransitions;
+};
+
+} // namespace HmiPhone

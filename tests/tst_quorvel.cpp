@@ -1,0 +1,449 @@
+// The state framework: one machine with its root hierarchy, adopted transitions, fan-out of one
+// notification to every enabled transition, the transition kinds and the state kinds.
+
+#include "testsupport.h"
+
+#include <quorvel/guardedpropertychangetransition.h>
+#include <quorvel/guardedpropertytransition.h>
+#include <quorvel/guardedsignaltransition.h>
+#include <quorvel/hmiconditionalstate.h>
+#include <quorvel/hmievent.h>
+#include <quorvel/hmilayeredstate.h>
+#include <quorvel/hmitransition.h>
+#include <quorvel/hmiviewstate.h>
+#include <quorvel/intsignaltransition.h>
+#include <quorvel/keysignaltransition.h>
+#include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
+
+#include <QTest>
+
+using namespace Quorvel;
+using TestSupport::processUntilIdle;
+
+namespace {
+
+// A data source stand-in: notifying properties, a key signal and a plain signal.
+class Source : public QObject
+{
+    Q_OBJECT
+    Q_PROPERTY(int status READ status WRITE setStatus NOTIFY statusChanged)
+    Q_PROPERTY(QVariant value READ value WRITE setValue NOTIFY valueChanged)
+public:
+    int status() const { return m_status; }
+    void setStatus(int status)
+    {
+        m_status = status;
+        emit statusChanged(status); // also when unchanged: the transitions decide
+    }
+    QVariant value() const { return m_value; }
+    void setValue(const QVariant &value)
+    {
+        m_value = value;
+        emit valueChanged();
+    }
+
+signals:
+    void statusChanged(int status);
+    void valueChanged();
+    void keyEvent(int key, int kind);
+    void ping();
+
+private:
+    int m_status = 0;
+    QVariant m_value;
+};
+
+// Screens: "Home" (view) and the layered "Phone" that opens on "Menu" through a conditional
+// state, with "Contacts" > "ContactsList"; one global popup.
+struct Tree
+{
+    Tree()
+    {
+        machine = StateMachine::instance();
+        HmiState *screens = machine->screensState();
+        home = new HmiViewState(QStringLiteral("T.Home"), QStringLiteral("Home"), screens);
+        phone = new HmiLayeredState(QStringLiteral("Phone"), screens);
+        choose = new HmiConditionalState(QStringLiteral("PhoneChoose"), phone);
+        menu = new HmiViewState(QStringLiteral("T.Menu"), QStringLiteral("Menu"), phone);
+        contacts = new HmiState(QStringLiteral("Contacts"), phone);
+        contactsList = new HmiViewState(QStringLiteral("T.ContactsList"),
+                                        QStringLiteral("ContactsList"), contacts);
+        contacts->setInitialHmiState(contactsList);
+        choose->setTargetState(menu);
+        phone->setInitialHmiState(choose);
+        screens->setInitialHmiState(home);
+        popup = new PopupState(QStringLiteral("T.Global"), 1);
+        QObject::connect(phone, &QState::entered, [this] { ++phoneEntries; });
+        QObject::connect(contactsList, &QState::entered, [this] { ++contactsListEntries; });
+    }
+    void start(const StateMachine::RootHierarchyTransitions &transitions = {})
+    {
+        machine->installRootHierarchy(transitions, {{StateLevel3, popup}});
+        machine->start();
+        processUntilIdle();
+    }
+    void goTo(QAbstractState *state)
+    {
+        machine->goToState(state);
+        processUntilIdle();
+    }
+    void post(const QString &event, const QVariant &value = QVariant())
+    {
+        machine->postEvent(new HmiEvent(event, value));
+        processUntilIdle();
+    }
+    StateMachine *machine;
+    HmiViewState *home;
+    HmiLayeredState *phone;
+    HmiConditionalState *choose;
+    HmiViewState *menu;
+    HmiState *contacts;
+    HmiViewState *contactsList;
+    PopupState *popup;
+    int phoneEntries = 0;
+    int contactsListEntries = 0;
+};
+
+bool active(const QString &name)
+{
+    NamedState *state = NamedState::stateForName(name);
+    return state && state->isActive();
+}
+
+} // namespace
+
+class TestQuorvel : public QObject
+{
+    Q_OBJECT
+private slots:
+    void cleanup()
+    {
+        StateMachine::destroyInstance();
+        Platform::Journal::instance()->clear();
+    }
+
+    void rootHierarchy()
+    {
+        Tree tree;
+        auto *adopted = new HmiTransition(QStringLiteral("Adopted"));
+        auto *listed = new HmiTransition(QStringLiteral("Listed"), tree.menu);
+        tree.start({{StateLevel2, adopted}, {StateLevel3, listed}});
+
+        for (const char *name : {"StateLevel1", "StateLevel2", "StateLevel3", "Screens", "Home"})
+            QVERIFY2(active(QLatin1String(name)), name);
+        QCOMPARE(tree.popup->parentState(), tree.machine->popupRegion());
+        QCOMPARE(adopted->sourceState(), tree.machine->levelState(StateLevel2));
+        QVERIFY(adopted->isAdopted());
+        QCOMPARE(listed->sourceState(), tree.menu);
+        QVERIFY(!listed->isAdopted());
+        QCOMPARE(StateMachine::instance(), tree.machine);
+    }
+
+    // An adopted transition with a target leaves only what lies below the deepest active
+    // proper ancestor of its target, and no popup closes.
+    void adoptedTransition_data()
+    {
+        QTest::addColumn<QString>("startIn");
+        QTest::addColumn<int>("phoneEntries");
+        QTest::addColumn<int>("contactsListEntries");
+        QTest::addRow("from the phone menu: menu left, phone stays") << "Menu" << 1 << 1;
+        QTest::addRow("from home: phone entered") << "Home" << 1 << 1;
+        QTest::addRow("target active: re-entered, phone stays") << "ContactsList" << 1 << 2;
+    }
+    void adoptedTransition()
+    {
+        QFETCH(QString, startIn);
+        QFETCH(int, phoneEntries);
+        QFETCH(int, contactsListEntries);
+        Tree tree;
+        auto *toContacts = new HmiTransition(QStringLiteral("ShowContacts"));
+        toContacts->setTargetState(tree.contacts);
+        tree.start({{StateLevel3, toContacts}});
+        tree.goTo(NamedState::stateForName(startIn));
+        QVERIFY(active(startIn));
+        tree.machine->requestPopup(QStringLiteral("T.Global"));
+        processUntilIdle();
+        QVERIFY(tree.popup->isActive());
+        tree.phoneEntries = 0;
+        tree.contactsListEntries = startIn == QLatin1String("ContactsList") ? 1 : 0;
+
+        tree.post(QStringLiteral("ShowContacts"));
+
+        QVERIFY(active(QStringLiteral("ContactsList")));
+        QVERIFY(!tree.menu->isActive());
+        QVERIFY(!tree.home->isActive());
+        QCOMPARE(tree.phoneEntries, startIn == QLatin1String("Home") ? phoneEntries : 0);
+        QCOMPARE(tree.contactsListEntries, contactsListEntries);
+        QVERIFY(tree.popup->isActive());
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-hidden")), QStringList());
+    }
+
+    void listedTransitionKeepsItsSource()
+    {
+        Tree tree;
+        auto *fromMenu = new HmiTransition(QStringLiteral("Go"), tree.menu);
+        fromMenu->setTargetState(tree.contacts);
+        tree.start({{StateLevel3, fromMenu}});
+        tree.post(QStringLiteral("Go"));
+        QVERIFY(tree.home->isActive());
+        tree.goTo(tree.phone);
+        tree.post(QStringLiteral("Go"));
+        QVERIFY(tree.contactsList->isActive());
+    }
+
+    // One notification fires every transition it enables, guards asked first in creation order,
+    // then the enabled ones in that order; one whose source was left meanwhile is dropped.
+    void fanOut_data()
+    {
+        QTest::addColumn<QString>("trigger");
+        QTest::addRow("hmi event") << "event";
+        QTest::addRow("signal") << "signal";
+        QTest::addRow("property notification") << "property";
+        QTest::addRow("key event") << "key";
+    }
+    void fanOut()
+    {
+        QFETCH(QString, trigger);
+        Tree tree;
+        Source source;
+        source.setStatus(1);
+        QStringList trace;
+        auto make = [&](const QString &name, QState *sourceState, int guard) {
+            HmiAbstractTransition *t = nullptr;
+            if (trigger == QLatin1String("event"))
+                t = new HmiTransition(QStringLiteral("Notify"), sourceState);
+            else if (trigger == QLatin1String("signal"))
+                t = new GuardedSignalTransition(&source, &Source::ping, sourceState);
+            else if (trigger == QLatin1String("property"))
+                t = new GuardedPropertyTransition(&source, "status", sourceState);
+            else
+                t = new KeySignalTransition(&source, "2keyEvent(int, int)", 12, 2, sourceState);
+            t->setObjectName(name);
+            if (guard >= 0) {
+                QObject::connect(t, &HmiAbstractTransition::transitionTest, t, [&trace, t, guard] {
+                    trace << t->objectName() + QLatin1Char('?');
+                    if (guard)
+                        t->setAllowTransition(true);
+                });
+            }
+            QObject::connect(t, &QAbstractTransition::triggered, t,
+                             [&trace, t] { trace << t->objectName(); });
+            return t;
+        };
+        make(QStringLiteral("A"), tree.phone, 1);
+        make(QStringLiteral("B"), tree.menu, 0);
+        make(QStringLiteral("C"), tree.menu, -1)->setTargetState(tree.contacts);
+        make(QStringLiteral("D"), tree.menu, 1);
+        HmiAbstractTransition *adopted = make(QStringLiteral("E"), nullptr, -1);
+        make(QStringLiteral("F"), tree.home, -1);
+        tree.start({{StateLevel3, adopted}});
+        tree.goTo(tree.phone);
+        QVERIFY(tree.menu->isActive());
+
+        if (trigger == QLatin1String("event"))
+            tree.machine->postEvent(new HmiEvent(QStringLiteral("Notify")));
+        else if (trigger == QLatin1String("signal"))
+            emit source.ping();
+        else if (trigger == QLatin1String("property"))
+            source.setStatus(2);
+        else
+            emit source.keyEvent(12, 2);
+        processUntilIdle();
+
+        QCOMPARE(trace,
+                 (QStringList{QStringLiteral("A?"), QStringLiteral("B?"), QStringLiteral("D?"),
+                              QStringLiteral("A"), QStringLiteral("C"), QStringLiteral("E")}));
+        QVERIFY(tree.contactsList->isActive());
+    }
+
+    void complementaryGuards_data()
+    {
+        QTest::addColumn<bool>("condition");
+        QTest::addColumn<QStringList>("fired");
+        QTest::addRow("condition holds") << true << QStringList{QStringLiteral("allowed")};
+        QTest::addRow("condition fails") << false << QStringList{QStringLiteral("refused")};
+    }
+    void complementaryGuards()
+    {
+        QFETCH(bool, condition);
+        QFETCH(QStringList, fired);
+        Tree tree;
+        QStringList trace;
+        for (bool wanted : {true, false}) {
+            auto *t = new HmiTransition(QStringLiteral("Siri"), tree.phone);
+            QObject::connect(t, &GuardedTransition::transitionTest, t,
+                             [&, t, wanted] { t->setAllowTransition(condition == wanted); });
+            QObject::connect(t, &QAbstractTransition::triggered, t, [&trace, wanted] {
+                trace << QString::fromLatin1(wanted ? "allowed" : "refused");
+            });
+        }
+        tree.start();
+        tree.goTo(tree.phone);
+        tree.post(QStringLiteral("Siri"));
+        QCOMPARE(trace, fired);
+    }
+
+    // The trigger of each kind, the guard's default and the transition data.
+    void transitionKinds_data()
+    {
+        QTest::addColumn<QString>("kind");
+        QTest::addColumn<QVariantList>("steps");
+        QTest::addColumn<int>("fires");
+        QTest::addColumn<QVariant>("data");
+        const QVariant none;
+        QTest::addRow("event: exact name, value as data")
+                << "event"
+                << QVariantList{QStringLiteral("Go"), QStringLiteral("go"), QStringLiteral("GO")}
+                << 1 << QVariant(QStringLiteral("Go"));
+        QTest::addRow("int signal: equal value only")
+                << "int 3" << QVariantList{1, 3, 4, 3} << 2 << QVariant(3);
+        QTest::addRow("key: key and kind both equal")
+                << "key 12 2"
+                << QVariantList{QVariantList{12, 2}, QVariantList{12, 3}, QVariantList{77, 2}} << 1
+                << QVariant(QVariantList{12, 2});
+        QTest::addRow("change: any to 3, only real changes")
+                << "change [] 3" << QVariantList{3, 3, 4, 3} << 2 << QVariant(3);
+        QTest::addRow("change: 3 to 7 only")
+                << "change [3] 7" << QVariantList{4, 7, 3, 7} << 1 << QVariant(7);
+        QTest::addRow("change: 12 to any other")
+                << "change [12] null" << QVariantList{12, 5, 12, 12, 0} << 2 << QVariant(0);
+        QTest::addRow("change: false to true")
+                << "change [false] true" << QVariantList{false, true, true, false, true} << 2
+                << QVariant(true);
+        QTest::addRow("change: remembered while source inactive")
+                << "change inactive [3] 7" << QVariantList{3, 7} << 1 << QVariant(7);
+        QTest::addRow("guard: default refuses") << "guarded" << QVariantList{1} << 0 << none;
+        QTest::addRow("guard: default allows when set")
+                << "guarded default" << QVariantList{1} << 1 << QVariant(1);
+        QTest::addRow("property: every notification")
+                << "property" << QVariantList{1, 1} << 2 << QVariant(1);
+    }
+    void transitionKinds()
+    {
+        QFETCH(QString, kind);
+        QFETCH(QVariantList, steps);
+        QFETCH(int, fires);
+        QFETCH(QVariant, data);
+        Tree tree;
+        Source source;
+        source.setValue(0);
+        const QStringList words = kind.split(QLatin1Char(' '));
+        auto toValue = [](const QString &word) -> QVariant {
+            if (word == QLatin1String("null"))
+                return QVariant();
+            if (word == QLatin1String("true") || word == QLatin1String("false"))
+                return word == QLatin1String("true");
+            return word.toInt();
+        };
+        HmiAbstractTransition *t = nullptr;
+        QState *sourceState = kind.contains(QLatin1String("inactive")) ? tree.contacts : tree.menu;
+        if (words[0] == QLatin1String("event")) {
+            t = new HmiTransition(QStringLiteral("Go"), sourceState);
+        } else if (words[0] == QLatin1String("int")) {
+            t = new IntSignalTransition(&source, SIGNAL(statusChanged(int)), words[1].toInt(),
+                                        sourceState);
+        } else if (words[0] == QLatin1String("key")) {
+            t = new KeySignalTransition(&source, "2keyEvent(int, int)", words[1].toInt(),
+                                        words[2].toInt(), sourceState);
+        } else if (words[0] == QLatin1String("change")) {
+            const QString fromWord = words[words.size() - 2];
+            QVariantList from;
+            if (fromWord != QLatin1String("[]"))
+                from << toValue(fromWord.mid(1, fromWord.size() - 2));
+            t = new GuardedPropertyChangeTransition(&source, "value", from, toValue(words.last()),
+                                                    sourceState);
+        } else if (words[0] == QLatin1String("guarded")) {
+            t = new GuardedSignalTransition(&source, "statusChanged(int)", sourceState);
+            t->setAllowTransitionDefault(words.size() > 1);
+            QObject::connect(t, &HmiAbstractTransition::transitionTest, [] {});
+        } else {
+            t = new GuardedPropertyTransition(&source, "value", sourceState);
+        }
+        QVariant lastData;
+        int count = 0;
+        QObject::connect(t, &QAbstractTransition::triggered, [&] {
+            ++count;
+            lastData = t->transitionData();
+        });
+        tree.start();
+        tree.goTo(tree.menu);
+
+        for (int i = 0; i < steps.size(); ++i) {
+            const QVariant &step = steps.at(i);
+            if (words[0] == QLatin1String("event")) {
+                tree.machine->postEvent(new HmiEvent(step.toString(), step));
+            } else if (words[0] == QLatin1String("key")) {
+                const QVariantList key = step.toList();
+                emit source.keyEvent(key[0].toInt(), key[1].toInt());
+            } else if (words[0] == QLatin1String("change")
+                       || words[0] == QLatin1String("property")) {
+                source.setValue(step);
+            } else {
+                source.setStatus(step.toInt());
+            }
+            processUntilIdle();
+            if (kind.contains(QLatin1String("inactive")) && i == 0)
+                tree.goTo(tree.contacts); // the first change happened while the source was inactive
+        }
+        QCOMPARE(count, fires);
+        QCOMPARE(lastData, data);
+    }
+
+    void layeredState()
+    {
+        Tree tree;
+        auto *layerPopup = new PopupState(QStringLiteral("T.Layer"), tree.phone, 1);
+        tree.start();
+        QCOMPARE(tree.menu->parentState(), tree.phone->exclusiveState());
+        QCOMPARE(layerPopup->parentState(), tree.phone->layerState());
+        QCOMPARE(tree.phone->initialHmiState(), tree.choose);
+        QCOMPARE(tree.phone->childMode(), QState::ParallelStates);
+    }
+
+    void conditionalState_data()
+    {
+        QTest::addColumn<bool>("setTarget");
+        QTest::addColumn<QString>("landsOn");
+        QTest::addRow("target chosen on entry") << true << "ContactsList";
+        QTest::addRow("no target: stays") << false << "PhoneChoose";
+    }
+    void conditionalState()
+    {
+        QFETCH(bool, setTarget);
+        QFETCH(QString, landsOn);
+        Tree tree;
+        tree.choose->setTargetState(nullptr);
+        int tests = 0;
+        QObject::connect(tree.choose, &HmiConditionalState::conditionTest, [&] {
+            ++tests;
+            if (setTarget)
+                tree.choose->setTargetState(tree.contacts);
+        });
+        tree.start();
+        tree.goTo(tree.phone);
+        QCOMPARE(tests, 1);
+        QVERIFY(active(landsOn));
+    }
+
+    void viewStates()
+    {
+        Tree tree;
+        tree.start();
+        QCOMPARE(HmiViewState::activeViewState(), tree.home);
+        tree.goTo(tree.phone);
+        QCOMPARE(HmiViewState::activeViewState(), tree.menu);
+        QCOMPARE(HmiViewState::lastKnownViewState(), QStringLiteral("Home"));
+        QCOMPARE(NamedState::stateForName(QStringLiteral("Menu")), tree.menu);
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("view")),
+                 (QStringList{QStringLiteral("T.Home"), QStringLiteral("T.Menu")}));
+        HmiViewState *dummy
+                = HmiViewState::createDummyViewState(QStringLiteral("Limbo"), tree.phone);
+        tree.goTo(dummy);
+        QCOMPARE(HmiViewState::lastKnownViewState(), QStringLiteral("Menu"));
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("view")).size(), 2);
+    }
+};
+
+QTEST_GUILESS_MAIN(TestQuorvel)
+#include "tst_quorvel.moc"

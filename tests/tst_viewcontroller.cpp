@@ -1,0 +1,385 @@
+// The view controller: popups stacked per region and shown while their layer is active,
+// dismissals, auto-dismiss, requests made during one notification, direct view requests and
+// back navigation with the per-view back settings.
+
+#include "testsupport.h"
+
+#include <brisken/viewcontroller.h>
+#include <quorvel/guardedpropertychangetransition.h>
+#include <quorvel/guardedsignaltransition.h>
+#include <quorvel/hmiconditionalstate.h>
+#include <quorvel/hmievent.h>
+#include <quorvel/hmilayeredstate.h>
+#include <quorvel/hmitargetblacklistfilter.h>
+#include <quorvel/hmitransition.h>
+#include <quorvel/hmiviewstate.h>
+#include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
+
+#include <QTest>
+
+using namespace Quorvel;
+using Brisken::ViewController;
+using TestSupport::journalValues;
+using TestSupport::processUntilIdle;
+
+namespace {
+
+class Source : public QObject
+{
+    Q_OBJECT
+    Q_PROPERTY(int status READ status WRITE setStatus NOTIFY statusChanged)
+public:
+    int status() const { return m_status; }
+    void setStatus(int status)
+    {
+        if (status == m_status)
+            return;
+        m_status = status;
+        emit statusChanged(status);
+    }
+signals:
+    void statusChanged(int status);
+
+private:
+    int m_status = 0;
+};
+
+QString id(const char *name)
+{
+    return QLatin1String("T.") + QLatin1String(name);
+}
+
+// A phone-like screen tree with the back settings of the phone screens, and popups.
+struct Screens
+{
+    Screens()
+    {
+        machine = StateMachine::instance();
+        HmiState *screens = machine->screensState();
+        home = view("Home", screens);
+        root = new HmiLayeredState(QStringLiteral("PhoneRoot"), screens);
+        auto *choose = new HmiConditionalState(QStringLiteral("PhoneChoose"), root);
+        call = new HmiState(QStringLiteral("Call"), root);
+        HmiViewState *callView = view("CallView", call);
+        callView->setHandlesBackEvent(true);
+        callView->setBackStackStateId(QStringLiteral("PhoneRoot"), true);
+        HmiViewState *inCallKeypad = view("InCallKeypad", call);
+        inCallKeypad->setHasBackStackPresence(false);
+        inCallKeypad->setBackTargetProviderState(callView);
+        call->setInitialHmiState(callView);
+        menu = view("Menu", root);
+        menu->setBackStackStateId(QStringLiteral("PhoneRoot"), false);
+        view("Keypad", root)->setHandlesBackEvent(true);
+        auto *book = new HmiLayeredState(QStringLiteral("Book"), root);
+        auto *bookChoose = new HmiConditionalState(QStringLiteral("BookChoose"), book);
+        HmiViewState *bookList = view("BookList", book);
+        bookList->createDirectBackTransition(root);
+        bookList->setBackStackStateId(QStringLiteral("BookChoose"), false);
+        view("BookSearch", book);
+        bookChoose->setTargetState(bookList);
+        book->setInitialHmiState(bookChoose);
+        view("SmsList", root)
+                ->addBackTargetFilter(QSharedPointer<HmiTargetFilter>(
+                        new HmiTargetBlacklistFilter(QStringLiteral("SmsReply"))));
+        view("SmsReply", root);
+        QObject::connect(choose, &HmiConditionalState::conditionTest,
+                         [this, choose] { choose->setTargetState(inCall ? call : menu); });
+        root->setInitialHmiState(choose);
+        screens->setInitialHmiState(home);
+
+        globalA = new PopupState(id("A"), 1);
+        globalB = new PopupState(id("B"), 1);
+        globalHigh = new PopupState(id("High"), 2);
+        layerPopup = new PopupState(id("Layer"), root, 1);
+    }
+    HmiViewState *view(const char *name, QState *parent)
+    {
+        return new HmiViewState(id(name), QLatin1String(name), parent);
+    }
+    void start(StateMachine::RootHierarchyTransitions transitions = {})
+    {
+        machine->installRootHierarchy(
+                transitions,
+                {{StateLevel3, globalA}, {StateLevel3, globalB}, {StateLevel2, globalHigh}});
+        machine->start();
+        processUntilIdle();
+    }
+    void goTo(const QString &name)
+    {
+        machine->goToState(NamedState::stateForName(name));
+        processUntilIdle();
+    }
+    QString activeView() const
+    {
+        HmiViewState *view = HmiViewState::activeViewState();
+        return view ? view->name() : QString();
+    }
+
+    StateMachine *machine;
+    HmiViewState *home;
+    HmiLayeredState *root;
+    HmiState *call;
+    HmiViewState *menu;
+    PopupState *globalA;
+    PopupState *globalB;
+    PopupState *globalHigh;
+    PopupState *layerPopup;
+    bool inCall = false;
+};
+
+QStringList ids(const QStringList &names)
+{
+    QStringList result;
+    for (const QString &name : names)
+        result << QLatin1String("T.") + name;
+    return result;
+}
+
+} // namespace
+
+class TestViewController : public QObject
+{
+    Q_OBJECT
+private slots:
+    void cleanup()
+    {
+        StateMachine::destroyInstance();
+        Platform::Journal::instance()->clear();
+    }
+
+    // Operations: "+X" request, "-X" dismiss, "go:State" navigate.
+    void popupStacking_data()
+    {
+        QTest::addColumn<QStringList>("operations");
+        QTest::addColumn<QStringList>("shown");
+        QTest::addColumn<QStringList>("globalStack");
+        auto row = [](const char *tag, const QString &operations, const QString &shown,
+                      const QString &stack) {
+            QTest::addRow("%s", tag) << operations.split(QLatin1Char(' '), Qt::SkipEmptyParts)
+                                     << ids(shown.split(QLatin1Char(' '), Qt::SkipEmptyParts))
+                                     << ids(stack.split(QLatin1Char(' '), Qt::SkipEmptyParts));
+        };
+        row("newest on top among equals", QStringLiteral("+A +B"), QStringLiteral("B"),
+            QStringLiteral("A B"));
+        row("higher priority stays above", QStringLiteral("+High +A"), QStringLiteral("High"),
+            QStringLiteral("A High"));
+        row("re-request moves up among equals", QStringLiteral("+A +B +A"), QStringLiteral("A"),
+            QStringLiteral("B A"));
+        row("dismissing the top reveals the next", QStringLiteral("+A +B -B"), QStringLiteral("A"),
+            QStringLiteral("A"));
+        row("dismissing below keeps the top", QStringLiteral("+A +B -A"), QStringLiteral("B"),
+            QStringLiteral("B"));
+        row("unknown identifier: recorded only", QStringLiteral("+Nowhere"), QString(), QString());
+        row("layer inactive: not shown", QStringLiteral("+Layer go:Menu"), QString(), QString());
+        row("layer active: shown beside the global one", QStringLiteral("go:Menu +Layer +A"),
+            QStringLiteral("A Layer"), QStringLiteral("A"));
+        row("leaving the layer closes its popups", QStringLiteral("go:Menu +Layer go:Home go:Menu"),
+            QString(), QString());
+    }
+    void popupStacking()
+    {
+        QFETCH(QStringList, operations);
+        QFETCH(QStringList, shown);
+        QFETCH(QStringList, globalStack);
+        Screens screens;
+        screens.start();
+        ViewController *controller = ViewController::instance();
+        QStringList requested;
+        for (const QString &operation : operations) {
+            const QString name = operation.mid(1);
+            if (operation.startsWith(QLatin1String("go:")))
+                screens.goTo(operation.mid(3));
+            else if (operation.startsWith(QLatin1Char('+')))
+                controller->requestPopup(id(name.toLatin1().constData()));
+            else
+                controller->dismissPopup(id(name.toLatin1().constData()));
+            processUntilIdle();
+        }
+        QCOMPARE(controller->shownPopups(), shown);
+        QCOMPARE(screens.machine->popupStack(id("A")), globalStack);
+        for (const QString &operation : operations) {
+            if (operation.startsWith(QLatin1Char('+')))
+                requested << id(operation.mid(1).toLatin1().constData());
+        }
+        QCOMPARE(journalValues(QStringLiteral("popup-request")), requested);
+    }
+
+    void autoDismiss()
+    {
+        Screens screens;
+        screens.globalA->setAutoDismissTimeoutActive(true);
+        screens.globalA->setAutoDismissTimeoutInterval(20);
+        screens.start();
+        ViewController::instance()->requestPopup(id("B"));
+        ViewController::instance()->requestPopup(id("A"));
+        processUntilIdle();
+        QVERIFY(screens.globalA->isActive());
+        QTRY_VERIFY(!screens.globalA->isActive());
+        processUntilIdle();
+        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("B")}));
+        QCOMPARE(journalValues(QStringLiteral("popup-hidden")), ids({QStringLiteral("A")}));
+    }
+
+    void dismissingPopup()
+    {
+        Screens screens;
+        screens.globalA->registerDismissingPopup(screens.globalB);
+        screens.start();
+        ViewController::instance()->requestPopup(id("A"));
+        ViewController::instance()->requestPopup(id("B"));
+        processUntilIdle();
+        ViewController::instance()->dismissPopup(id("B"));
+        processUntilIdle();
+        QCOMPARE(ViewController::instance()->shownPopups(), QStringList());
+    }
+
+    // A popup left by a module transition for another popup is no longer requested.
+    void popupLeftByTransition()
+    {
+        Screens screens;
+        auto *accept = new HmiTransition(QStringLiteral("Accept"), screens.globalB);
+        accept->setTargetState(screens.globalHigh);
+        screens.start();
+        ViewController::instance()->requestPopup(id("A"));
+        ViewController::instance()->requestPopup(id("B"));
+        processUntilIdle();
+        screens.machine->postEvent(new HmiEvent(QStringLiteral("Accept")));
+        processUntilIdle();
+        QCOMPARE(screens.machine->popupStack(id("A")),
+                 ids({QStringLiteral("A"), QStringLiteral("High")}));
+        ViewController::instance()->dismissPopup(id("High"));
+        processUntilIdle();
+        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("A")}));
+    }
+
+    // Requests and dismissals made by the transitions of one notification take effect after all
+    // of them, in the order made; a registered dismissing transition closes at once.
+    void requestsDuringOneNotification_data()
+    {
+        QTest::addColumn<QString>("first");
+        QTest::addColumn<QString>("second");
+        QTest::addColumn<QStringList>("shown");
+        QTest::addRow("request, then a transition closing the set")
+                << "+A"
+                << "close" << ids({QStringLiteral("A")});
+        QTest::addRow("dismiss, then request") << "-A"
+                                               << "+A" << ids({QStringLiteral("A")});
+        QTest::addRow("request, then dismiss") << "+A"
+                                               << "-A" << ids({QStringLiteral("B")});
+    }
+    void requestsDuringOneNotification()
+    {
+        QFETCH(QString, first);
+        QFETCH(QString, second);
+        QFETCH(QStringList, shown);
+        Screens screens;
+        Source source;
+        StateMachine::RootHierarchyTransitions adopted;
+        for (const QString &action : {first, second}) {
+            QAbstractTransition *t = nullptr;
+            if (action == QLatin1String("close")) {
+                t = new GuardedSignalTransition(&source, &Source::statusChanged);
+                screens.globalA->registerDismissingTransition(t);
+                screens.globalB->registerDismissingTransition(t);
+            } else {
+                t = new GuardedPropertyChangeTransition(&source, "status", {}, 3);
+                QObject::connect(t, &QAbstractTransition::triggered, [action] {
+                    if (action.startsWith(QLatin1Char('+')))
+                        ViewController::instance()->requestPopup(id("A"));
+                    else
+                        ViewController::instance()->dismissPopup(id("A"));
+                });
+            }
+            adopted.append({StateLevel3, t});
+        }
+        screens.start(adopted);
+        ViewController::instance()->requestPopup(id("B"));
+        processUntilIdle();
+        source.setStatus(3);
+        processUntilIdle();
+        QCOMPARE(ViewController::instance()->shownPopups(), shown);
+    }
+
+    void showView_data()
+    {
+        QTest::addColumn<QString>("request");
+        QTest::addColumn<QString>("activeView");
+        QTest::addRow("state name: the component chooses") << "PhoneRoot"
+                                                           << "Menu";
+        QTest::addRow("view identifier") << "T.Keypad"
+                                         << "Keypad";
+        QTest::addRow("unknown: recorded only") << "T.Nowhere"
+                                                << "Home";
+    }
+    void showView()
+    {
+        QFETCH(QString, request);
+        QFETCH(QString, activeView);
+        Screens screens;
+        screens.start();
+        ViewController::instance()->showView(request, QVariant(), false, QVariant());
+        processUntilIdle();
+        QCOMPARE(screens.activeView(), activeView);
+        QCOMPARE(journalValues(QStringLiteral("view-request")), QStringList{request});
+    }
+
+    // Back handling of the phone screens.
+    void back_data()
+    {
+        QTest::addColumn<QStringList>("path");
+        QTest::addColumn<bool>("inCall");
+        QTest::addColumn<int>("steps");
+        QTest::addColumn<QString>("landsOn");
+        QTest::addColumn<QStringList>("backStack");
+        auto row = [](const char *tag, const QString &path, bool inCall, int steps,
+                      const QString &landsOn, const QString &stack) {
+            QTest::addRow("%s", tag) << path.split(QLatin1Char(' ')) << inCall << steps << landsOn
+                                     << stack.split(QLatin1Char(' '), Qt::SkipEmptyParts);
+        };
+        row("keypad back to the menu", QStringLiteral("Menu Keypad"), false, 1,
+            QStringLiteral("Menu"), QStringLiteral("Home Menu"));
+        row("menu back to home", QStringLiteral("Menu"), false, 1, QStringLiteral("Home"),
+            QStringLiteral("Home"));
+        row("two steps", QStringLiteral("Menu Keypad"), false, 2, QStringLiteral("Home"),
+            QStringLiteral("Home"));
+        row("back to the menu lets the root choose again", QStringLiteral("Menu Keypad"), true, 1,
+            QStringLiteral("CallView"), QStringLiteral("Home CallView"));
+        row("in-call keypad back to the call view", QStringLiteral("CallView InCallKeypad"), true,
+            1, QStringLiteral("CallView"), QStringLiteral("Home CallView"));
+        row("call view entry is unique", QStringLiteral("CallView Menu CallView"), false, 1,
+            QStringLiteral("Menu"), QStringLiteral("Home Menu"));
+        row("contacts list straight to the phone root", QStringLiteral("Menu BookSearch BookList"),
+            false, 1, QStringLiteral("Menu"), QStringLiteral("Home Menu BookSearch Menu"));
+        row("back to the contacts list re-enters its chooser",
+            QStringLiteral("BookList BookSearch"), false, 1, QStringLiteral("BookList"),
+            QStringLiteral("Home BookList"));
+        row("message list skips the reply view", QStringLiteral("SmsReply SmsList"), false, 1,
+            QStringLiteral("Home"), QStringLiteral("Home"));
+        row("nothing to go back to", QStringLiteral("Home"), false, 1, QStringLiteral("Home"),
+            QStringLiteral("Home"));
+    }
+    void back()
+    {
+        QFETCH(QStringList, path);
+        QFETCH(bool, inCall);
+        QFETCH(int, steps);
+        QFETCH(QString, landsOn);
+        QFETCH(QStringList, backStack);
+        Screens screens;
+        screens.start();
+        for (const QString &state : path)
+            screens.goTo(state);
+        QCOMPARE(screens.activeView(), path.last());
+        screens.inCall = inCall;
+        ViewController::instance()->back(steps);
+        processUntilIdle();
+        QCOMPARE(screens.activeView(), landsOn);
+        QCOMPARE(ViewController::instance()->backStack(), backStack);
+        QCOMPARE(journalValues(QStringLiteral("back"), QStringLiteral("steps")),
+                 QStringList{QString::number(steps)});
+    }
+};
+
+QTEST_GUILESS_MAIN(TestViewController)
+#include "tst_viewcontroller.moc"
