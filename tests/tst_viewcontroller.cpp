@@ -205,6 +205,17 @@ private slots:
         QCOMPARE(journalValues(QStringLiteral("popup-request")), requested);
     }
 
+    // A state entering may ask for a popup of its own layer.
+    void requestOnEntryOfLayer()
+    {
+        Screens screens;
+        QObject::connect(screens.root, &QState::entered,
+                         [] { ViewController::instance()->requestPopup(id("Layer")); });
+        screens.start();
+        screens.goTo(QStringLiteral("PhoneRoot"));
+        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("Layer")}));
+    }
+
     void autoDismiss()
     {
         Screens screens;
