@@ -4,6 +4,7 @@
 
 #include "testsupport.h"
 
+#include <brisken/popuputils.h>
 #include <brisken/viewcontroller.h>
 #include <quorvel/guardedpropertychangetransition.h>
 #include <quorvel/guardedsignaltransition.h>
@@ -291,8 +292,8 @@ private slots:
             QAbstractTransition *t = nullptr;
             if (action == QLatin1String("close")) {
                 t = new GuardedSignalTransition(&source, &Source::statusChanged);
-                screens.globalA->registerDismissingTransition(t);
-                screens.globalB->registerDismissingTransition(t);
+                Brisken::PopupUtils::makeExclusive(
+                        t, QList<PopupState *>{screens.globalA, screens.globalB});
             } else {
                 t = new GuardedPropertyChangeTransition(&source, "status", {}, 3);
                 QObject::connect(t, &QAbstractTransition::triggered, [action] {
