@@ -2,6 +2,7 @@
 
 #include <quorvel/statelevel.h>
 
+#include <QHash>
 #include <QList>
 #include <QObject>
 #include <QPair>
