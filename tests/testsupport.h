@@ -3,6 +3,7 @@
 // Helpers shared by the test suites: run the event loop until the state machine is idle, read the
 // platform journal, and fail on framework warnings that a test did not expect.
 
+#include <host/modulehost.h>
 #include <journal/journal.h>
 
 #include <QCoreApplication>
@@ -14,11 +15,7 @@ namespace TestSupport {
 // Start and posted events are asynchronous: process until nothing is left to do.
 inline void processUntilIdle()
 {
-    for (int round = 0; round < 20; ++round) {
-        QCoreApplication::sendPostedEvents();
-        QCoreApplication::processEvents(QEventLoop::AllEvents);
-    }
-    QCoreApplication::sendPostedEvents();
+    Host::processUntilIdle();
 }
 
 // The journal entries of one kind since a sequence number, as the value of one field

@@ -1,16 +1,24 @@
 #include "hmiphonepopupmanager.h"
 
+#include "hmiphoneviews.h"
+
+#include <brisken/viewcontroller.h>
+
 #include <QCoreApplication>
+#include <QPointer>
 #include <QVariant>
 
 namespace HmiPhone {
 
 namespace {
-HmiPhonePopupManager *s_instance = nullptr;
-}
+// Guarded: should the application object delete the instance, the next caller gets a new one
+// rather than a dangling pointer.
+QPointer<HmiPhonePopupManager> s_instance;
+} // namespace
 
 HmiPhonePopupManager::HmiPhonePopupManager(QObject *parent)
     : QObject(parent)
+    , m_viewController(Brisken::ViewController::instance())
 { }
 
 HmiPhonePopupManager *HmiPhonePopupManager::instance()
@@ -22,367 +30,370 @@ HmiPhonePopupManager *HmiPhonePopupManager::instance()
 
 void HmiPhonePopupManager::request(const QString &viewId)
 {
-    Q_UNUSED(viewId)
+    // Popup data is always empty: the views read what they show from the data bridge.
+    if (m_viewController)
+        m_viewController->requestPopup(viewId, QVariant());
 }
 
 void HmiPhonePopupManager::dismiss(const QString &viewId)
 {
-    Q_UNUSED(viewId)
+    if (m_viewController)
+        m_viewController->dismissPopup(viewId);
 }
 
 void HmiPhonePopupManager::showNoCellularSignal()
 {
-    request(QStringLiteral("NoCellularSignal"));
+    request(Views::NoCellularSignal);
 }
 
 void HmiPhonePopupManager::showDialingFailure()
 {
-    request(QStringLiteral("DialingFailed"));
+    request(Views::DialingFailed);
 }
 
 void HmiPhonePopupManager::hideDialingFailure()
 {
-    dismiss(QStringLiteral("DialingFailed"));
+    dismiss(Views::DialingFailed);
 }
 
 void HmiPhonePopupManager::showDialing3rdFailure()
 {
-    request(QStringLiteral("Dialing3rdFailure"));
+    request(Views::Dialing3rdFailure);
 }
 
 void HmiPhonePopupManager::showIncomingCall()
 {
-    request(QStringLiteral("IncomingCall"));
+    request(Views::IncomingCall);
 }
 
 void HmiPhonePopupManager::dismissIncomingCall()
 {
-    dismiss(QStringLiteral("IncomingCall"));
+    dismiss(Views::IncomingCall);
 }
 
 void HmiPhonePopupManager::showWaitingCall()
 {
-    request(QStringLiteral("WaitingCall"));
+    request(Views::WaitingCall);
 }
 
 void HmiPhonePopupManager::dismissWaitingCall()
 {
-    dismiss(QStringLiteral("WaitingCall"));
+    dismiss(Views::WaitingCall);
 }
 
 void HmiPhonePopupManager::showCallAcceptanceFailure()
 {
-    request(QStringLiteral("CallAnswerNotResponding"));
+    request(Views::CallAnswerNotResponding);
 }
 
 void HmiPhonePopupManager::showDeviceIssueFixHint()
 {
-    request(QStringLiteral("DeviceIssueFixHint"));
+    request(Views::DeviceIssueFixHint);
 }
 
 void HmiPhonePopupManager::showCallEnded()
 {
-    request(QStringLiteral("CallEnded"));
+    request(Views::CallEnded);
 }
 
 void HmiPhonePopupManager::showMissedCall()
 {
-    request(QStringLiteral("MissedCallPopup"));
+    request(Views::MissedCallPopup);
 }
 
 void HmiPhonePopupManager::showRoamingWarning()
 {
-    request(QStringLiteral("RoamingWarning"));
+    request(Views::RoamingWarning);
 }
 
 void HmiPhonePopupManager::showBatteryLow()
 {
-    request(QStringLiteral("BatteryLow"));
+    request(Views::BatteryLow);
 }
 
 void HmiPhonePopupManager::showPhoneConnectionUnstablePopup()
 {
-    request(QStringLiteral("PhoneConnectionUnstable"));
+    request(Views::PhoneConnectionUnstable);
 }
 
 void HmiPhonePopupManager::showPhoneConnectionLost()
 {
-    request(QStringLiteral("PhoneConnectionLost"));
+    request(Views::PhoneConnectionLost);
 }
 
 void HmiPhonePopupManager::hidePhoneConnectionLost()
 {
-    dismiss(QStringLiteral("PhoneConnectionLost"));
+    dismiss(Views::PhoneConnectionLost);
 }
 
 void HmiPhonePopupManager::showUnableToConnect()
 {
-    request(QStringLiteral("UnableToConnect"));
+    request(Views::UnableToConnect);
 }
 
 void HmiPhonePopupManager::hideUnableToConnect()
 {
-    dismiss(QStringLiteral("UnableToConnect"));
+    dismiss(Views::UnableToConnect);
 }
 
 void HmiPhonePopupManager::showHandsFreeError()
 {
-    request(QStringLiteral("HandsFreeError"));
+    request(Views::HandsFreeError);
 }
 
 void HmiPhonePopupManager::showRedial()
 {
-    request(QStringLiteral("Redial"));
+    request(Views::Redial);
 }
 
 void HmiPhonePopupManager::showTransferToPhone()
 {
-    request(QStringLiteral("PhoneCallStandByModePopup"));
+    request(Views::PhoneCallStandByModePopup);
 }
 
 void HmiPhonePopupManager::hideTransferToPhone()
 {
-    dismiss(QStringLiteral("PhoneCallStandByModePopup"));
+    dismiss(Views::PhoneCallStandByModePopup);
 }
 
 void HmiPhonePopupManager::showPhoneBookDownloadFailedRetryAvailable()
 {
-    request(QStringLiteral("PhoneBookDownloadFailedRetryAvailable"));
+    request(Views::PhoneBookDownloadFailedRetryAvailable);
 }
 
 void HmiPhonePopupManager::showPhoneBookDownloadFailed()
 {
-    request(QStringLiteral("PhoneBookDownloadFailed"));
+    request(Views::PhoneBookDownloadFailed);
 }
 
 void HmiPhonePopupManager::showSmsDownloadFailedRetryAvailable()
 {
-    request(QStringLiteral("SmsDownloadFailedRetryAvailable"));
+    request(Views::SmsDownloadFailedRetryAvailable);
 }
 
 void HmiPhonePopupManager::showSmsDownloadFailed()
 {
-    request(QStringLiteral("SmsDownloadFailedFinal"));
+    request(Views::SmsDownloadFailedFinal);
 }
 
 void HmiPhonePopupManager::newTextMessageAlert1Show()
 {
-    request(QStringLiteral("NewTextMessageAlert1"));
+    request(Views::NewTextMessageAlert1);
 }
 
 void HmiPhonePopupManager::newTextMessageAlert2Show()
 {
-    request(QStringLiteral("NewTextMessageAlert2"));
+    request(Views::NewTextMessageAlert2);
 }
 
 void HmiPhonePopupManager::newTextMessageAlert2Hide()
 {
-    dismiss(QStringLiteral("NewTextMessageAlert2"));
+    dismiss(Views::NewTextMessageAlert2);
 }
 
 void HmiPhonePopupManager::showTextMessagingOff()
 {
-    request(QStringLiteral("PhoneSmsTextMessagingOff"));
+    request(Views::PhoneSmsTextMessagingOff);
 }
 
 void HmiPhonePopupManager::hideTextMessagingOff()
 {
-    dismiss(QStringLiteral("PhoneSmsTextMessagingOff"));
+    dismiss(Views::PhoneSmsTextMessagingOff);
 }
 
 void HmiPhonePopupManager::showMessageAccessProfileNotSupported()
 {
-    request(QStringLiteral("PhoneSmsNotSupported"));
+    request(Views::PhoneSmsNotSupported);
 }
 
 void HmiPhonePopupManager::showMessageAccessNotGranted()
 {
-    request(QStringLiteral("PhoneSmsAccessNotGranted"));
+    request(Views::PhoneSmsAccessNotGranted);
 }
 
 void HmiPhonePopupManager::showMessageWaitingForResponseFromPhone()
 {
-    request(QStringLiteral("PhoneSmsWaitingForResponseFromPhone"));
+    request(Views::PhoneSmsWaitingForResponseFromPhone);
 }
 
 void HmiPhonePopupManager::hideMessageWaitingForResponseFromPhone()
 {
-    dismiss(QStringLiteral("PhoneSmsWaitingForResponseFromPhone"));
+    dismiss(Views::PhoneSmsWaitingForResponseFromPhone);
 }
 
 void HmiPhonePopupManager::showMessagesDownloading()
 {
-    request(QStringLiteral("PhoneSmsDownloading"));
+    request(Views::PhoneSmsDownloading);
 }
 
 void HmiPhonePopupManager::hideMessagesDownloading()
 {
-    dismiss(QStringLiteral("PhoneSmsDownloading"));
+    dismiss(Views::PhoneSmsDownloading);
 }
 
 void HmiPhonePopupManager::showMessagesDownloadFailed()
 {
-    request(QStringLiteral("PhoneSmsDownloadFailed"));
+    request(Views::PhoneSmsDownloadFailed);
 }
 
 void HmiPhonePopupManager::showMessagesRetryDownloadFailed()
 {
-    request(QStringLiteral("PhoneSmsRetryDownloadFailed"));
+    request(Views::PhoneSmsRetryDownloadFailed);
 }
 
 void HmiPhonePopupManager::hideMessagesDownloadFailed()
 {
-    dismiss(QStringLiteral("PhoneSmsDownloadFailed"));
+    dismiss(Views::PhoneSmsDownloadFailed);
 }
 
 void HmiPhonePopupManager::showSendTextMessage()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessage"));
+    request(Views::PhoneSmsSendTextMessage);
 }
 
 void HmiPhonePopupManager::hideSendTextMessage()
 {
-    dismiss(QStringLiteral("PhoneSmsSendTextMessage"));
+    dismiss(Views::PhoneSmsSendTextMessage);
 }
 
 void HmiPhonePopupManager::showSendTextMessageProgress()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessageProgress"));
+    request(Views::PhoneSmsSendTextMessageProgress);
 }
 
 void HmiPhonePopupManager::hideSendTextMessageProgress()
 {
-    dismiss(QStringLiteral("PhoneSmsSendTextMessageProgress"));
+    dismiss(Views::PhoneSmsSendTextMessageProgress);
 }
 
 void HmiPhonePopupManager::showSendTextMessageSuccess()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessageSuccess"));
+    request(Views::PhoneSmsSendTextMessageSuccess);
 }
 
 void HmiPhonePopupManager::showSendTextMessageNoResponseFromPhone()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessageNoResponseFromPhone"));
+    request(Views::PhoneSmsSendTextMessageNoResponseFromPhone);
 }
 
 void HmiPhonePopupManager::showSendTextMessageFailure()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessageFailure"));
+    request(Views::PhoneSmsSendTextMessageFailure);
 }
 
 void HmiPhonePopupManager::hideSendTextMessageFailure()
 {
-    dismiss(QStringLiteral("PhoneSmsSendTextMessageFailure"));
+    dismiss(Views::PhoneSmsSendTextMessageFailure);
 }
 
 void HmiPhonePopupManager::showPhoneBookDownloadCompletePopup()
 {
-    request(QStringLiteral("PhoneBookDownloadComplete"));
+    request(Views::PhoneBookDownloadComplete);
 }
 
 void HmiPhonePopupManager::hidePhoneBookDownloadCompletePopup()
 {
-    dismiss(QStringLiteral("PhoneBookDownloadComplete"));
+    dismiss(Views::PhoneBookDownloadComplete);
 }
 
 void HmiPhonePopupManager::showRetrySendMessageFailure()
 {
-    request(QStringLiteral("PhoneSmsRetrySendTextMessageFailure"));
+    request(Views::PhoneSmsRetrySendTextMessageFailure);
 }
 
 void HmiPhonePopupManager::showSendMessageNetworkFailure()
 {
-    request(QStringLiteral("PhoneSmsSendTextMessageNetworkFailure"));
+    request(Views::PhoneSmsSendTextMessageNetworkFailure);
 }
 
 void HmiPhonePopupManager::showMultipleTextMessagePopup()
 {
-    request(QStringLiteral("MultipleTextMessagesReceived"));
+    request(Views::MultipleTextMessagesReceived);
 }
 
 void HmiPhonePopupManager::hideMultipleTextMessagePopup()
 {
-    dismiss(QStringLiteral("MultipleTextMessagesReceived"));
+    dismiss(Views::MultipleTextMessagesReceived);
 }
 
 void HmiPhonePopupManager::showDTMFKeyPressNoResponseErrorPopup()
 {
-    request(QStringLiteral("DTMFKeyPressNoResponseErrorPopup"));
+    request(Views::DTMFKeyPressNoResponseErrorPopup);
 }
 
 void HmiPhonePopupManager::hideDTMFKeyPressNoResponseErrorPopup()
 {
-    dismiss(QStringLiteral("DTMFKeyPressNoResponseErrorPopup"));
+    dismiss(Views::DTMFKeyPressNoResponseErrorPopup);
 }
 
 void HmiPhonePopupManager::showPhoneAudioTransferErrorPopup()
 {
-    request(QStringLiteral("PhoneAudioTransferErrorPopup"));
+    request(Views::PhoneAudioTransferErrorPopup);
 }
 
 void HmiPhonePopupManager::hidePhoneAudioTransferErrorPopup()
 {
-    dismiss(QStringLiteral("PhoneAudioTransferErrorPopup"));
+    dismiss(Views::PhoneAudioTransferErrorPopup);
 }
 
 void HmiPhonePopupManager::showPhoneCallStandByModePopup()
 {
-    request(QStringLiteral("PhoneCallStandByModePopup"));
+    request(Views::PhoneCallStandByModePopup);
 }
 
 void HmiPhonePopupManager::hidePhoneCallStandByModePopup()
 {
-    dismiss(QStringLiteral("PhoneCallStandByModePopup"));
+    dismiss(Views::PhoneCallStandByModePopup);
 }
 
 void HmiPhonePopupManager::showUnstableConnectionWithKovaPopup()
 {
-    request(QStringLiteral("UnstableDeviceConnectionWithKovaPopup"));
+    request(Views::UnstableDeviceConnectionWithKovaPopup);
 }
 
 void HmiPhonePopupManager::hideUnstableConnectionWithKovaPopup()
 {
-    dismiss(QStringLiteral("UnstableDeviceConnectionWithKovaPopup"));
+    dismiss(Views::UnstableDeviceConnectionWithKovaPopup);
 }
 
 void HmiPhonePopupManager::showPhoneSiriNoResponseErrorPopup()
 {
-    request(QStringLiteral("SiriConnectionNotRespondingPopup"));
+    request(Views::SiriConnectionNotRespondingPopup);
 }
 
 void HmiPhonePopupManager::hidePhoneSiriNoResponseErrorPopup()
 {
-    dismiss(QStringLiteral("SiriConnectionNotRespondingPopup"));
+    dismiss(Views::SiriConnectionNotRespondingPopup);
 }
 
 void HmiPhonePopupManager::showPhoneContactsTooLargeErrorPopup()
 {
-    request(QStringLiteral("ContactsListTooLargePopup"));
+    request(Views::ContactsListTooLargePopup);
 }
 
 void HmiPhonePopupManager::hidePhoneContactsTooLargeErrorPopup()
 {
-    dismiss(QStringLiteral("ContactsListTooLargePopup"));
+    dismiss(Views::ContactsListTooLargePopup);
 }
 
 void HmiPhonePopupManager::showSiriNotEnabledErrorPopup()
 {
-    request(QStringLiteral("siriFeatureNotEnabledPopup"));
+    request(Views::siriFeatureNotEnabledPopup);
 }
 
 void HmiPhonePopupManager::hideSiriNotEnabledErrorPopup()
 {
-    dismiss(QStringLiteral("siriFeatureNotEnabledPopup"));
+    dismiss(Views::siriFeatureNotEnabledPopup);
 }
 
 void HmiPhonePopupManager::showPhoneDndActiveArdel()
 {
-    request(QStringLiteral("PhoneDndActiveArdel"));
+    request(Views::PhoneDndActiveArdel);
 }
 
 void HmiPhonePopupManager::hidePhoneDndActiveArdel()
 {
-    dismiss(QStringLiteral("PhoneDndActiveArdel"));
+    dismiss(Views::PhoneDndActiveArdel);
 }
 
 } // namespace HmiPhone

@@ -1,0 +1,75 @@
+#pragma once
+
+#include <QObject>
+#include <QPluginLoader>
+#include <QPointer>
+#include <QString>
+
+class QQmlEngine;
+
+namespace Quorvel {
+class HmiState;
+class HmiViewState;
+} // namespace Quorvel
+
+#include <taldris/hmimoduleintegration.h>
+
+namespace Taldris {
+class ModuleInterface;
+} // namespace Taldris
+
+namespace Host {
+
+// Runs the event loop until the machine has handled what was posted (start and posted events are
+// asynchronous).
+void processUntilIdle();
+
+// A small HMI host for one module. The host's screens in the state machine's screens region:
+//   "HOST.Home"      the home screen, a view state and the initial screen;
+//   "HOST.Module"    the parent state handed to the module's createScreenStateSubTree;
+//   "HOST.Settings"  the settings screen, where the settings module hosts submodules.
+// Bring-up, in the host's order: load() or use(), setUp(), start(). Destroying the host stops
+// the machine and deletes it with its tree, then the module's integration.
+class ModuleHost : public QObject
+{
+    Q_OBJECT
+public:
+    explicit ModuleHost(QObject *parent = nullptr);
+    ~ModuleHost() override;
+
+    // Loads the plug-in file, checking that it offers the module interface.
+    bool load(const QString &pluginFile);
+    // Uses a module that is linked into the program instead of a plug-in file.
+    void use(Taldris::ModuleInterface *module);
+
+    // Asks the module for `moduleName`'s integration, registers its QML types and exports its
+    // objects to `engine`'s root context (when given), builds the root hierarchy with the host's
+    // screens, has the module build its subtree under "HOST.Module", and installs the module's
+    // root-hierarchy popups and transitions.
+    bool setUp(const QString &moduleName, QQmlEngine *engine = nullptr);
+    // Starts the machine and runs the event loop until the home screen is shown.
+    void start();
+
+    // The host's menu bar: open the module's root component or the home screen.
+    void openModule();
+    void openHome();
+
+    Taldris::HmiModuleIntegration *integration() const { return m_integration; }
+    Quorvel::HmiState *moduleRoot() const { return m_moduleRoot; }
+    Quorvel::HmiState *moduleParent() const { return m_moduleParent; }
+    Quorvel::HmiViewState *home() const { return m_home; }
+    Quorvel::HmiState *settings() const { return m_settings; }
+    QString errorString() const { return m_error; }
+
+private:
+    QPluginLoader m_loader;
+    Taldris::ModuleInterface *m_module = nullptr;
+    QPointer<Taldris::HmiModuleIntegration> m_integration;
+    Quorvel::HmiViewState *m_home = nullptr;
+    Quorvel::HmiState *m_moduleParent = nullptr;
+    Quorvel::HmiState *m_settings = nullptr;
+    Quorvel::HmiState *m_moduleRoot = nullptr;
+    QString m_error;
+};
+
+} // namespace Host

@@ -1,0 +1,136 @@
+#include "hmiphoneintegration.h"
+
+#include "hmiphonecontroller.h"
+#include "hmiphoneintenthandler.h"
+#include "hmiphonepopupmanager.h"
+
+#include <brisken/viewmanager.h>
+#include <mavrosk/bluetoothsource.h>
+#include <mavrosk/eaphonesource.h>
+#include <mavrosk/phonesource.h>
+#include <mavrosk/projectionsource.h>
+#include <taldris/hmiintentmanager.h>
+#include <taldris/hmisubmoduleprovider.h>
+
+#include <QPointer>
+#include <QQmlContext>
+#include <QtQml>
+
+namespace HmiPhone {
+
+namespace {
+
+const char QmlUri[] = "HmiPhone";
+
+template<typename T> void registerUncreatable(const char *qmlName)
+{
+    qmlRegisterUncreatableType<T>(QmlUri, 1, 0, qmlName,
+                                  QLatin1String(qmlName) + QLatin1String(" is not creatable"));
+}
+
+} // namespace
+
+const Taldris::PellumCategory &hmiphone()
+{
+    static const Taldris::PellumCategory category("orvane.hmiphone", 1);
+    return category;
+}
+
+HmiPhoneIntegration::HmiPhoneIntegration(QObject *parent)
+    : Taldris::HmiModuleIntegration(1, parent)
+    , m_controller(new HmiPhoneController(this))
+    // Taking the shared instance here creates the popup manager before any phone state exists.
+    , m_popupManager(HmiPhonePopupManager::instance())
+    , m_globalStateHandler(nullptr)
+    , m_intentHandler(new HmiPhoneIntentHandler(m_controller, this))
+{
+    Taldris::HmiIntentManager::instance()->registerIntentHandler(m_intentHandler);
+}
+
+HmiPhoneIntegration::~HmiPhoneIntegration() = default;
+
+QString HmiPhoneIntegration::moduleName() const
+{
+    return QStringLiteral("Phone");
+}
+
+int HmiPhoneIntegration::modulePriority() const
+{
+    return 30;
+}
+
+int HmiPhoneIntegration::moduleDomain() const
+{
+    return 2;
+}
+
+QString HmiPhoneIntegration::viewDescriptorFile() const
+{
+    return QStringLiteral("plugins/hmiphone/view-descriptor.json");
+}
+
+QString HmiPhoneIntegration::rootStateIdentifier() const
+{
+    return Brisken::ViewManager::viewIdentifier(moduleId(), QStringLiteral("Root"));
+}
+
+QUrl HmiPhoneIntegration::iconUrl() const
+{
+    return QUrl(QStringLiteral("menubar/icon_phone"), QUrl::TolerantMode);
+}
+
+Taldris::HmiModuleIntegration::RootHierarchyTransitions
+HmiPhoneIntegration::moduleRootHierarchyTransitions() const
+{
+    return {};
+}
+
+Taldris::HmiModuleIntegration::RootHierarchyPopupStates
+HmiPhoneIntegration::moduleRootHierarchyPopupStates() const
+{
+    return {};
+}
+
+void HmiPhoneIntegration::registerTypes()
+{
+    qCDebug(hmiphone) << Q_FUNC_INFO;
+    registerUncreatable<HmiPhoneIntegration>("HmiPhoneIntegration");
+    registerUncreatable<HmiPhoneController>("HmiPhoneController");
+    registerUncreatable<Mavrosk::PhoneSource>("PhoneSource");
+    registerUncreatable<Mavrosk::EAPhoneSource>("EAPhoneSource");
+    registerUncreatable<Mavrosk::BluetoothSource>("BluetoothSource");
+    registerUncreatable<Mavrosk::ProjectionSource>("ProjectionSource");
+}
+
+Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
+{
+    qCDebug(hmiphone) << Q_FUNC_INFO;
+    Q_UNUSED(parent)
+    Quorvel::HmiState *rootComponent = nullptr;
+    if (rootComponent)
+        Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
+                                                                    2);
+    return rootComponent;
+}
+
+void HmiPhoneIntegration::exportObjects(QQmlContext *context)
+{
+    qCDebug(hmiphone) << Q_FUNC_INFO;
+    context->setContextProperty(QStringLiteral("_hmiphone"), this);
+    context->setContextProperty(QStringLiteral("_hmiphoneController"), m_controller);
+}
+
+QString HmiPhoneIntegration::createViewIdentifier(const QString &viewName) const
+{
+    return Brisken::ViewManager::viewIdentifier(moduleId(), viewName);
+}
+
+} // namespace HmiPhone
+
+Taldris::HmiModuleIntegration *HmiPhoneModule::createModuleIntegration(const QString &name,
+                                                                       QObject *parent)
+{
+    if (name != QLatin1String("HmiPhone"))
+        return nullptr;
+    return new HmiPhone::HmiPhoneIntegration(parent);
+}

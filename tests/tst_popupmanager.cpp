@@ -1,0 +1,205 @@
+// The popup manager: every slot makes one framework request or dismissal for its own view, and
+// the single instance lives with the application.
+
+#include "hmiphonepopupmanager.h"
+#include "testsupport.h"
+
+#include <brisken/viewmanager.h>
+#include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
+
+#include <QMetaMethod>
+
+using HmiPhone::HmiPhonePopupManager;
+
+namespace {
+
+struct SlotRow
+{
+    const char *slot;
+    const char *kind; // journal kind of the framework call
+    const char *view;
+};
+
+// Every slot in its meta-object order, with the call it makes and the view it names.
+const SlotRow slotTable[] = {
+        {"showNoCellularSignal", "popup-request", "NoCellularSignal"},
+        {"showDialingFailure", "popup-request", "DialingFailed"},
+        {"hideDialingFailure", "popup-dismiss", "DialingFailed"},
+        {"showDialing3rdFailure", "popup-request", "Dialing3rdFailure"},
+        {"showIncomingCall", "popup-request", "IncomingCall"},
+        {"dismissIncomingCall", "popup-dismiss", "IncomingCall"},
+        {"showWaitingCall", "popup-request", "WaitingCall"},
+        {"dismissWaitingCall", "popup-dismiss", "WaitingCall"},
+        {"showCallAcceptanceFailure", "popup-request", "CallAnswerNotResponding"},
+        {"showDeviceIssueFixHint", "popup-request", "DeviceIssueFixHint"},
+        {"showCallEnded", "popup-request", "CallEnded"},
+        {"showMissedCall", "popup-request", "MissedCallPopup"},
+        {"showRoamingWarning", "popup-request", "RoamingWarning"},
+        {"showBatteryLow", "popup-request", "BatteryLow"},
+        {"showPhoneConnectionUnstablePopup", "popup-request", "PhoneConnectionUnstable"},
+        {"showPhoneConnectionLost", "popup-request", "PhoneConnectionLost"},
+        {"hidePhoneConnectionLost", "popup-dismiss", "PhoneConnectionLost"},
+        {"showUnableToConnect", "popup-request", "UnableToConnect"},
+        {"hideUnableToConnect", "popup-dismiss", "UnableToConnect"},
+        {"showHandsFreeError", "popup-request", "HandsFreeError"},
+        {"showRedial", "popup-request", "Redial"},
+        {"showTransferToPhone", "popup-request", "PhoneCallStandByModePopup"},
+        {"hideTransferToPhone", "popup-dismiss", "PhoneCallStandByModePopup"},
+        {"showPhoneBookDownloadFailedRetryAvailable", "popup-request",
+         "PhoneBookDownloadFailedRetryAvailable"},
+        {"showPhoneBookDownloadFailed", "popup-request", "PhoneBookDownloadFailed"},
+        {"showSmsDownloadFailedRetryAvailable", "popup-request", "SmsDownloadFailedRetryAvailable"},
+        {"showSmsDownloadFailed", "popup-request", "SmsDownloadFailedFinal"},
+        {"newTextMessageAlert1Show", "popup-request", "NewTextMessageAlert1"},
+        {"newTextMessageAlert2Show", "popup-request", "NewTextMessageAlert2"},
+        {"newTextMessageAlert2Hide", "popup-dismiss", "NewTextMessageAlert2"},
+        {"showTextMessagingOff", "popup-request", "PhoneSmsTextMessagingOff"},
+        {"hideTextMessagingOff", "popup-dismiss", "PhoneSmsTextMessagingOff"},
+        {"showMessageAccessProfileNotSupported", "popup-request", "PhoneSmsNotSupported"},
+        {"showMessageAccessNotGranted", "popup-request", "PhoneSmsAccessNotGranted"},
+        {"showMessageWaitingForResponseFromPhone", "popup-request",
+         "PhoneSmsWaitingForResponseFromPhone"},
+        {"hideMessageWaitingForResponseFromPhone", "popup-dismiss",
+         "PhoneSmsWaitingForResponseFromPhone"},
+        {"showMessagesDownloading", "popup-request", "PhoneSmsDownloading"},
+        {"hideMessagesDownloading", "popup-dismiss", "PhoneSmsDownloading"},
+        {"showMessagesDownloadFailed", "popup-request", "PhoneSmsDownloadFailed"},
+        {"showMessagesRetryDownloadFailed", "popup-request", "PhoneSmsRetryDownloadFailed"},
+        {"hideMessagesDownloadFailed", "popup-dismiss", "PhoneSmsDownloadFailed"},
+        {"showSendTextMessage", "popup-request", "PhoneSmsSendTextMessage"},
+        {"hideSendTextMessage", "popup-dismiss", "PhoneSmsSendTextMessage"},
+        {"showSendTextMessageProgress", "popup-request", "PhoneSmsSendTextMessageProgress"},
+        {"hideSendTextMessageProgress", "popup-dismiss", "PhoneSmsSendTextMessageProgress"},
+        {"showSendTextMessageSuccess", "popup-request", "PhoneSmsSendTextMessageSuccess"},
+        {"showSendTextMessageNoResponseFromPhone", "popup-request",
+         "PhoneSmsSendTextMessageNoResponseFromPhone"},
+        {"showSendTextMessageFailure", "popup-request", "PhoneSmsSendTextMessageFailure"},
+        {"hideSendTextMessageFailure", "popup-dismiss", "PhoneSmsSendTextMessageFailure"},
+        {"showPhoneBookDownloadCompletePopup", "popup-request", "PhoneBookDownloadComplete"},
+        {"hidePhoneBookDownloadCompletePopup", "popup-dismiss", "PhoneBookDownloadComplete"},
+        {"showRetrySendMessageFailure", "popup-request", "PhoneSmsRetrySendTextMessageFailure"},
+        {"showSendMessageNetworkFailure", "popup-request", "PhoneSmsSendTextMessageNetworkFailure"},
+        {"showMultipleTextMessagePopup", "popup-request", "MultipleTextMessagesReceived"},
+        {"hideMultipleTextMessagePopup", "popup-dismiss", "MultipleTextMessagesReceived"},
+        {"showDTMFKeyPressNoResponseErrorPopup", "popup-request",
+         "DTMFKeyPressNoResponseErrorPopup"},
+        {"hideDTMFKeyPressNoResponseErrorPopup", "popup-dismiss",
+         "DTMFKeyPressNoResponseErrorPopup"},
+        {"showPhoneAudioTransferErrorPopup", "popup-request", "PhoneAudioTransferErrorPopup"},
+        {"hidePhoneAudioTransferErrorPopup", "popup-dismiss", "PhoneAudioTransferErrorPopup"},
+        {"showPhoneCallStandByModePopup", "popup-request", "PhoneCallStandByModePopup"},
+        {"hidePhoneCallStandByModePopup", "popup-dismiss", "PhoneCallStandByModePopup"},
+        {"showUnstableConnectionWithKovaPopup", "popup-request",
+         "UnstableDeviceConnectionWithKovaPopup"},
+        {"hideUnstableConnectionWithKovaPopup", "popup-dismiss",
+         "UnstableDeviceConnectionWithKovaPopup"},
+        {"showPhoneSiriNoResponseErrorPopup", "popup-request", "SiriConnectionNotRespondingPopup"},
+        {"hidePhoneSiriNoResponseErrorPopup", "popup-dismiss", "SiriConnectionNotRespondingPopup"},
+        {"showPhoneContactsTooLargeErrorPopup", "popup-request", "ContactsListTooLargePopup"},
+        {"hidePhoneContactsTooLargeErrorPopup", "popup-dismiss", "ContactsListTooLargePopup"},
+        {"showSiriNotEnabledErrorPopup", "popup-request", "siriFeatureNotEnabledPopup"},
+        {"hideSiriNotEnabledErrorPopup", "popup-dismiss", "siriFeatureNotEnabledPopup"},
+        {"showPhoneDndActiveArdel", "popup-request", "PhoneDndActiveArdel"},
+        {"hidePhoneDndActiveArdel", "popup-dismiss", "PhoneDndActiveArdel"},
+};
+
+QString phoneView(const char *view)
+{
+    return Brisken::ViewManager::viewIdentifier(QStringLiteral("PHONE"), QLatin1String(view));
+}
+
+} // namespace
+
+class TestPopupManager : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init()
+    {
+        Quorvel::StateMachine::destroyInstance();
+        Platform::Journal::instance()->clear();
+    }
+    void cleanup()
+    {
+        Quorvel::StateMachine::destroyInstance();
+        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
+    }
+
+    void singleInstance()
+    {
+        HmiPhonePopupManager *first = HmiPhonePopupManager::instance();
+        QVERIFY(first);
+        QCOMPARE(HmiPhonePopupManager::instance(), first);
+        QCOMPARE(first->parent(), QCoreApplication::instance());
+    }
+
+    void slotsInTableOrder()
+    {
+        const QMetaObject *meta = &HmiPhonePopupManager::staticMetaObject;
+        QStringList declared;
+        for (int i = meta->methodOffset(); i < meta->methodCount(); ++i) {
+            if (meta->method(i).methodType() == QMetaMethod::Slot)
+                declared.append(QLatin1String(meta->method(i).name()));
+        }
+        QStringList expected;
+        for (const SlotRow &row : slotTable)
+            expected.append(QLatin1String(row.slot));
+        QCOMPARE(expected.size(), 71);
+        QCOMPARE(declared, expected);
+    }
+
+    void slotMakesOneCall_data()
+    {
+        QTest::addColumn<QString>("slot");
+        QTest::addColumn<QString>("kind");
+        QTest::addColumn<QString>("viewId");
+        for (const SlotRow &row : slotTable)
+            QTest::addRow("%s", row.slot) << QString::fromLatin1(row.slot)
+                                          << QString::fromLatin1(row.kind) << phoneView(row.view);
+    }
+
+    void slotMakesOneCall()
+    {
+        QFETCH(QString, slot);
+        QFETCH(QString, kind);
+        QFETCH(QString, viewId);
+
+        QVERIFY(QMetaObject::invokeMethod(HmiPhonePopupManager::instance(),
+                                          slot.toLatin1().constData()));
+
+        const QList<Platform::JournalEntry> entries = Platform::Journal::instance()->entries();
+        QCOMPARE(entries.size(), 1);
+        QCOMPARE(entries.first().kind, kind);
+        QCOMPARE(entries.first().fields.value(QStringLiteral("id")).toString(), viewId);
+    }
+
+    // Two pairs of slots share one view: the one shown through either pair closes through the
+    // other. The request carries no data.
+    void sharedStandByPopup()
+    {
+        Quorvel::StateMachine *machine = Quorvel::StateMachine::instance();
+        const QString viewId = phoneView("PhoneCallStandByModePopup");
+        machine->installRootHierarchy({},
+                                      {{Quorvel::StateLevel3, new Quorvel::PopupState(viewId, 1)}});
+        machine->start();
+        TestSupport::processUntilIdle();
+
+        HmiPhonePopupManager::instance()->showTransferToPhone();
+        TestSupport::processUntilIdle();
+        QCOMPARE(machine->shownPopups(), QStringList{viewId});
+        QVERIFY(!machine->popupState(viewId)->popupData().isValid());
+
+        HmiPhonePopupManager::instance()->hidePhoneCallStandByModePopup();
+        TestSupport::processUntilIdle();
+        QCOMPARE(machine->shownPopups(), QStringList());
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-hidden")), QStringList{viewId});
+    }
+
+private:
+    TestSupport::FrameworkWarningGuard m_guard;
+};
+
+QTEST_GUILESS_MAIN(TestPopupManager)
+#include "tst_popupmanager.moc"
