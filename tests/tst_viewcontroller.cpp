@@ -4,6 +4,7 @@
 
 #include "testsupport.h"
 
+#include <brisken/popuputils.h>
 #include <brisken/viewcontroller.h>
 #include <quorvel/guardedpropertychangetransition.h>
 #include <quorvel/guardedsignaltransition.h>
@@ -205,6 +206,17 @@ private slots:
         QCOMPARE(journalValues(QStringLiteral("popup-request")), requested);
     }
 
+    // A state entering may ask for a popup of its own layer.
+    void requestOnEntryOfLayer()
+    {
+        Screens screens;
+        QObject::connect(screens.root, &QState::entered,
+                         [] { ViewController::instance()->requestPopup(id("Layer")); });
+        screens.start();
+        screens.goTo(QStringLiteral("PhoneRoot"));
+        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("Layer")}));
+    }
+
     void autoDismiss()
     {
         Screens screens;
@@ -280,8 +292,8 @@ private slots:
             QAbstractTransition *t = nullptr;
             if (action == QLatin1String("close")) {
                 t = new GuardedSignalTransition(&source, &Source::statusChanged);
-                screens.globalA->registerDismissingTransition(t);
-                screens.globalB->registerDismissingTransition(t);
+                Brisken::PopupUtils::makeExclusive(
+                        t, QList<PopupState *>{screens.globalA, screens.globalB});
             } else {
                 t = new GuardedPropertyChangeTransition(&source, "status", {}, 3);
                 QObject::connect(t, &QAbstractTransition::triggered, [action] {

@@ -1,10 +1,9 @@
 #include "popuputils.h"
 
-#include "viewcontroller.h"
+#include <quorvel/popupstate.h>
 
 #include <QAbstractState>
 #include <QAbstractTransition>
-#include <QPointer>
 
 namespace Brisken {
 
@@ -14,18 +13,12 @@ void makeExclusive(QAbstractTransition *transition, const QList<QAbstractState *
 {
     if (!transition)
         return;
-    QList<QPointer<QAbstractState>> closed;
+    // The popups close as part of the transition's firing, not as a dismissal request: requests
+    // made by the other transitions of the same notification take effect after it.
     for (QAbstractState *popup : popups) {
-        if (popup)
-            closed.append(popup);
+        if (auto *popupState = qobject_cast<Quorvel::PopupState *>(popup))
+            popupState->registerDismissingTransition(transition);
     }
-    // A popup state is named by its view identifier.
-    QObject::connect(transition, &QAbstractTransition::triggered, transition, [closed] {
-        for (const QPointer<QAbstractState> &popup : closed) {
-            if (popup)
-                ViewController::instance()->dismissPopup(popup->objectName());
-        }
-    });
 }
 
 } // namespace PopupUtils

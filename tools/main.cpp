@@ -1,0 +1,207 @@
+// hmiphone-sim: hosts the phone module's plug-in as a head unit's HMI host does, plays the
+// phone's side from a scenario and writes what the HMI would show and what the module asks of
+// the phone, on a virtual clock.
+
+#include "outputwriter.h"
+#include "scenariorunner.h"
+#include "scenariostep.h"
+#include "simulatedphone.h"
+#include "virtualeventdispatcher.h"
+
+#include <host/modulehost.h>
+#include <mavrosk/bridge.h>
+
+#include <QCommandLineParser>
+#include <QCoreApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QQmlEngine>
+#include <QTextStream>
+
+#include <cstdio>
+#include <iostream>
+#include <string>
+
+#ifndef HMIPHONE_PLUGIN_FILE
+#define HMIPHONE_PLUGIN_FILE ""
+#endif
+
+namespace {
+
+const QString ModuleName = QStringLiteral("HmiPhone");
+const QString ModuleLogCategory = QStringLiteral("orvane.hmiphone");
+
+enum ExitCode { Passed = 0, ChecksFailed = 1, CannotRun = 2 };
+
+// The plug-in built with this program; beside the program's directory when the build tree moved.
+QString defaultPluginFile()
+{
+    const QString built = QString::fromUtf8(HMIPHONE_PLUGIN_FILE);
+    if (!built.isEmpty() && QFileInfo::exists(built))
+        return built;
+    const QString besides
+            = QDir(QCoreApplication::applicationDirPath())
+                      .filePath(QStringLiteral("../plugins/") + QFileInfo(built).fileName());
+    return QFileInfo::exists(besides) ? besides : built;
+}
+
+int logLevel(const QString &name)
+{
+    const QStringList levels
+            = {QStringLiteral("debug"), QStringLiteral("info"), QStringLiteral("warning"),
+               QStringLiteral("critical"), QStringLiteral("none")};
+    return levels.indexOf(name);
+}
+
+// Makes every source of the data bridge, so that steps find them by their short names.
+void createBridge()
+{
+    Mavrosk::PhoneSource::instance();
+    Mavrosk::EAPhoneSource::instance();
+    Mavrosk::BluetoothSource::instance();
+    Mavrosk::ProjectionSource::instance();
+    Mavrosk::SpeechSource::instance();
+    Mavrosk::KeySource::instance();
+    Mavrosk::NavSource::instance();
+    Mavrosk::GlobalSource::instance();
+    Mavrosk::ArdelSource::instance();
+}
+
+void printError(const QString &message)
+{
+    std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
+}
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    auto *clock = new Simulator::VirtualEventDispatcher;
+    QCoreApplication::setEventDispatcher(clock);
+    QCoreApplication app(argc, argv);
+    QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(QStringLiteral(
+            "Runs the phone module's plug-in in a simulated HMI host and plays a scenario (JSON "
+            "Lines) against it on a virtual clock. Writes, one per line, what the HMI would show "
+            "and what the module asks of the phone; exits 1 when an expectation fails."));
+    parser.addHelpOption();
+    parser.addPositionalArgument(QStringLiteral("scenario"),
+                                 QStringLiteral("Scenario file (.jsonl); \"-\" reads stdin."));
+    const QCommandLineOption jsonOption(QStringLiteral("json"),
+                                        QStringLiteral("Write outputs as JSON Lines."));
+    const QCommandLineOption pluginOption(
+            QStringLiteral("plugin"),
+            QStringLiteral("The module's plug-in file (default: %1).").arg(defaultPluginFile()),
+            QStringLiteral("path"), defaultPluginFile());
+    const QCommandLineOption phoneOption(
+            QStringLiteral("phone"),
+            QStringLiteral("Who plays the phone: \"scripted\" (the scenario alone, the default) "
+                           "or \"simulated\" (a connected phone that answers the module's "
+                           "commands)."),
+            QStringLiteral("mode"), QStringLiteral("scripted"));
+    const QCommandLineOption interactiveOption(
+            QStringLiteral("interactive"),
+            QStringLiteral("Read steps from standard input, one per line, and write outputs as "
+                           "they happen."));
+    const QCommandLineOption logOption(
+            QStringLiteral("log"),
+            QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
+                           "critical or none (default: debug)."),
+            QStringLiteral("level"), QStringLiteral("debug"));
+    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption});
+    parser.process(app);
+
+    const bool interactive = parser.isSet(interactiveOption);
+    const QStringList positional = parser.positionalArguments();
+    if (positional.size() > 1 || (positional.isEmpty() && !interactive)) {
+        printError(QStringLiteral("give one scenario file, or --interactive"));
+        return CannotRun;
+    }
+    const QString phoneMode = parser.value(phoneOption);
+    if (phoneMode != QLatin1String("scripted") && phoneMode != QLatin1String("simulated")) {
+        printError(QStringLiteral("--phone is scripted or simulated"));
+        return CannotRun;
+    }
+    const int level = logLevel(parser.value(logOption));
+    if (level < 0) {
+        printError(QStringLiteral("--log is debug, info, warning, critical or none"));
+        return CannotRun;
+    }
+
+    QStringList lines;
+    QString scenarioName = QStringLiteral("stdin");
+    if (!positional.isEmpty() && positional.first() != QLatin1String("-")) {
+        scenarioName = positional.first();
+        QFile file(scenarioName);
+        if (!file.open(QIODevice::ReadOnly | QIODevice::Text)) {
+            printError(QStringLiteral("cannot read %1: %2").arg(scenarioName, file.errorString()));
+            return CannotRun;
+        }
+        lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+    }
+    const bool readStdin = interactive || positional.value(0) == QLatin1String("-");
+
+    Simulator::OutputWriter output(clock,
+                                   parser.isSet(jsonOption) ? Simulator::OutputWriter::Json
+                                                            : Simulator::OutputWriter::Human);
+    output.captureLog(ModuleLogCategory, level);
+    createBridge();
+
+    Host::ModuleHost host;
+    const QString pluginFile = parser.value(pluginOption);
+    if (!host.load(pluginFile)) {
+        printError(QStringLiteral("cannot load %1: %2").arg(pluginFile, host.errorString()));
+        return CannotRun;
+    }
+    QQmlEngine engine;
+
+    Simulator::SimulatedPhone *phone = nullptr;
+    if (phoneMode == QLatin1String("simulated")) {
+        phone = new Simulator::SimulatedPhone(&app);
+        phone->connectPhone();
+    }
+
+    Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
+    // A scenario that starts the machine itself applies the steps before it to a machine that
+    // has not started; the others start before their first step.
+    for (int i = 0; i < lines.size(); ++i) {
+        Simulator::ScenarioStep step;
+        if (Simulator::ScenarioStep::parse(lines.at(i), i + 1, &step)
+            && step.kind == Simulator::ScenarioStep::Start)
+            runner.setStartDeferred(true);
+    }
+
+    for (int i = 0; i < lines.size() && runner.setUpError().isEmpty(); ++i)
+        runner.playLine(lines.at(i), i + 1);
+    if (readStdin) {
+        std::string text;
+        for (int line = 1; runner.setUpError().isEmpty() && std::getline(std::cin, text); ++line)
+            runner.playLine(QString::fromStdString(text), line);
+    }
+    if (runner.setUpError().isEmpty())
+        runner.finish();
+    if (!runner.setUpError().isEmpty()) {
+        printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
+        return CannotRun;
+    }
+
+    if (runner.failures() > 0) {
+        QStringList failedLines;
+        for (int line : runner.failedLines())
+            failedLines.append(QString::number(line));
+        printError(QStringLiteral("%1: %2 of %3 checks failed (%4 %5)")
+                           .arg(scenarioName)
+                           .arg(runner.failures())
+                           .arg(runner.checks())
+                           .arg(failedLines.size() == 1 ? QStringLiteral("line")
+                                                        : QStringLiteral("lines"))
+                           .arg(failedLines.join(QStringLiteral(", "))));
+        return ChecksFailed;
+    }
+    output.note(
+            QStringLiteral("# %1: all %2 checks passed").arg(scenarioName).arg(runner.checks()));
+    return Passed;
+}

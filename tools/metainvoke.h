@@ -1,0 +1,18 @@
+#pragma once
+
+#include <QMetaMethod>
+#include <QString>
+#include <QVariant>
+#include <QVariantList>
+
+class QObject;
+
+namespace Simulator {
+
+// Calls a slot, an invokable method or a signal of `object` by name, as QML would: the method of
+// that name and number of parameters whose parameters the arguments convert to. Returns false
+// and sets `error` when there is none. `result` receives a value the method returns.
+bool invokeByName(QObject *object, const QString &name, const QVariantList &args,
+                  QMetaMethod::MethodType type, QString *error, QVariant *result = nullptr);
+
+} // namespace Simulator
