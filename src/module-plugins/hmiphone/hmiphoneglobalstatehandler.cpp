@@ -6,8 +6,12 @@
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 #include "phone_cmp.h"
+#include "phonebook_cmp.h"
+#include "phonecall_cmp.h"
+#include "phonestatusalerts.h"
 
 #include <brisken/datastore.h>
+#include <brisken/dismisspopup.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
 #include <brisken/viewmanager.h>
@@ -25,6 +29,7 @@
 #include <quorvel/hmitransition.h>
 #include <quorvel/intsignaltransition.h>
 #include <quorvel/keysignaltransition.h>
+#include <quorvel/hmiviewstate.h>
 #include <quorvel/popupstate.h>
 #include <taldris/hardkeycontroller.h>
 #include <taldris/hmiintentmanager.h>
