@@ -3,6 +3,8 @@
 #include "hmiphonecontroller.h"
 #include "hmiphoneintenthandler.h"
 #include "hmiphonepopupmanager.h"
+#include "phone_cmp.h"
+#include "phonemenustate.h"
 
 #include <brisken/viewmanager.h>
 #include <mavrosk/bluetoothsource.h>
@@ -105,8 +107,13 @@ void HmiPhoneIntegration::registerTypes()
 Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
 {
     qCDebug(hmiphone) << Q_FUNC_INFO;
-    Q_UNUSED(parent)
-    Quorvel::HmiState *rootComponent = nullptr;
+    const QString rootStateId = rootStateIdentifier();
+    auto *rootComponent = new Phone_Cmp(this, m_controller, rootStateId, parent);
+    // The phone menu's entry and exit reach the views through the controller.
+    connect(rootComponent->phoneIdleState(), &QAbstractState::exited, m_controller,
+            &HmiPhoneController::phoneMenuExited);
+    connect(rootComponent->phoneIdleState(), &QAbstractState::entered, m_controller,
+            &HmiPhoneController::phoneMenuEntered);
     if (rootComponent)
         Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
                                                                     2);
