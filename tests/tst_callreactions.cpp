@@ -37,8 +37,7 @@ Mavrosk::PhoneSource *phone()
 QStringList outputsSince(qint64 since)
 {
     QStringList outputs;
-    for (const Platform::JournalEntry &entry :
-         Platform::Journal::instance()->entriesSince(since)) {
+    for (const Platform::JournalEntry &entry : Platform::Journal::instance()->entriesSince(since)) {
         QString what;
         if (entry.kind.startsWith(QLatin1String("popup-request"))
             || entry.kind == QLatin1String("popup-dismiss"))
@@ -46,8 +45,9 @@ QStringList outputsSince(qint64 since)
         else if (entry.kind.startsWith(QLatin1String("transient")))
             what = entry.fields.value(QStringLiteral("name")).toString();
         else if (entry.kind == QLatin1String("bridge") || entry.kind == QLatin1String("event"))
-            what = entry.fields.value(entry.kind == QLatin1String("bridge") ? QStringLiteral("call")
-                                                                           : QStringLiteral("name"))
+            what = entry.fields
+                           .value(entry.kind == QLatin1String("bridge") ? QStringLiteral("call")
+                                                                        : QStringLiteral("name"))
                            .toString();
         else
             continue;
@@ -160,8 +160,8 @@ void TestCallReactions::incomingCall_data()
     QTest::addRow("during a call, message read aloud")
             << false << 7 << true << false << true
             << QStringList{QStringLiteral("popup-request WaitingCall")};
-    QTest::addRow("two calls connected") << false << 9 << true << true << false
-                                         << QStringList{reject};
+    QTest::addRow("two calls connected")
+            << false << 9 << true << true << false << QStringList{reject};
     QTest::addRow("status 11") << false << 11 << true << false << false << QStringList{reject};
     QTest::addRow("do not disturb") << true << 0 << false << false << false << QStringList();
 }
@@ -186,8 +186,8 @@ void TestCallReactions::incomingCall()
     phone()->setIncomingCall(true);
     TestSupport::processUntilIdle();
     QCOMPARE(outputsSince(since), outputs);
-    QCOMPARE(shown(QStringLiteral("IncomingCall")), outputs.endsWith(QStringLiteral(
-                                                            "popup-request IncomingCall")));
+    QCOMPARE(shown(QStringLiteral("IncomingCall")),
+             outputs.endsWith(QStringLiteral("popup-request IncomingCall")));
 }
 
 void TestCallReactions::answer_data()
@@ -297,9 +297,8 @@ void TestCallReactions::missedCall()
 
     // Leaving the popup asks the recent-calls list for the calls just missed.
     const qint64 closed = mark();
-    Brisken::ViewController::instance()->dismissPopup(
-            Brisken::ViewManager::viewIdentifier(QStringLiteral("PHONE"),
-                                                 QStringLiteral("MissedCallPopup")));
+    Brisken::ViewController::instance()->dismissPopup(Brisken::ViewManager::viewIdentifier(
+            QStringLiteral("PHONE"), QStringLiteral("MissedCallPopup")));
     TestSupport::processUntilIdle();
     QCOMPARE(outputsSince(closed).contains(QStringLiteral("event HmiPhone_RequestRecentCallList")),
              listRequested);
@@ -313,8 +312,8 @@ void TestCallReactions::dialingFailures_data()
 
     const QString failed = QStringLiteral("DialingFailed");
     const QString third = QStringLiteral("Dialing3rdFailure");
-    QTest::addRow("1, 2, 3rd, then again") << 3 << QList<int>{1, 1, 1, 1}
-                                           << QStringList{failed, failed, third, failed};
+    QTest::addRow("1, 2, 3rd, then again")
+            << 3 << QList<int>{1, 1, 1, 1} << QStringList{failed, failed, third, failed};
     QTest::addRow("no signal does not count")
             << 0 << QList<int>{1, 0, 1, 1}
             << QStringList{failed, QStringLiteral("NoCellularSignal"), failed, third};
@@ -368,8 +367,8 @@ void TestCallReactions::outgoingCallTransients()
         phone()->setStatus(status);
         TestSupport::processUntilIdle();
     }
-    QStringList seen = outputsSince(since).filter(QRegularExpression(
-            QStringLiteral("^transient |DialingFailed")));
+    QStringList seen = outputsSince(since).filter(
+            QRegularExpression(QStringLiteral("^transient |DialingFailed")));
     QCOMPARE(seen, outputs);
 }
 
@@ -409,8 +408,7 @@ void TestCallReactions::callEnded()
     const qint64 confirmed = mark();
     post(Events::HmiPhone_CallEndConfirmed);
     post(Events::HmiPhone_CallEndConfirmed);
-    const int dismissals
-            = outputsSince(confirmed).count(QStringLiteral("popup-dismiss CallEnded"));
+    const int dismissals = outputsSince(confirmed).count(QStringLiteral("popup-dismiss CallEnded"));
     QCOMPARE(dismissals, statusBar == 2 ? 0 : 1);
     QVERIFY(!shown(QStringLiteral("CallEnded")));
 }
@@ -441,8 +439,7 @@ void TestCallReactions::roamingConfirmation()
     const qint64 since = mark();
     post(Events::HmiPhone_ConfirmRoamingCall);
     QStringList sent;
-    for (const Platform::JournalEntry &entry :
-         Platform::Journal::instance()->entriesSince(since)) {
+    for (const Platform::JournalEntry &entry : Platform::Journal::instance()->entriesSince(since)) {
         if (entry.kind != QLatin1String("bridge"))
             continue;
         QStringList args;

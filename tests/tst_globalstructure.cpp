@@ -190,7 +190,8 @@ QString describe(QAbstractTransition *transition)
     QString text;
     if (auto *key = qobject_cast<Quorvel::KeySignalTransition *>(transition)) {
         text = QStringLiteral("key %1/%2").arg(key->key()).arg(key->kind());
-    } else if (auto *change = qobject_cast<Quorvel::GuardedPropertyChangeTransition *>(transition)) {
+    } else if (auto *change
+               = qobject_cast<Quorvel::GuardedPropertyChangeTransition *>(transition)) {
         QStringList from;
         for (const QVariant &value : change->fromValues())
             from.append(valueText(value));
@@ -266,9 +267,9 @@ void TestGlobalStructure::popupList()
     for (int i = 0; i < own; ++i) {
         const QString where = QStringLiteral("popup %1").arg(i + 1);
         Quorvel::PopupState *popup = popups.at(i).second;
-        QVERIFY2(popup->viewId().endsWith(QLatin1Char('.')
-                                          + QLatin1String(expectedPopups[i].first)),
-                 qPrintable(where + QStringLiteral(": ") + popup->viewId()));
+        QVERIFY2(
+                popup->viewId().endsWith(QLatin1Char('.') + QLatin1String(expectedPopups[i].first)),
+                qPrintable(where + QStringLiteral(": ") + popup->viewId()));
         QCOMPARE(int(popups.at(i).first), 3);
         QCOMPARE(popup->priority(), 1);
         QCOMPARE(popup->autoDismissTimeoutActive(), expectedPopups[i].second > 0);
@@ -300,7 +301,6 @@ void TestGlobalStructure::transitionList()
         actual.append(describe(transitions.at(i).second));
         actualLevels.append(transitions.at(i).first);
     }
-    qDebug().noquote() << actual.join(QLatin1Char(10));
     QCOMPARE(actual, expected);
     QCOMPARE(actualLevels, levels);
 

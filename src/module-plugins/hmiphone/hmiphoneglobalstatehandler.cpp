@@ -27,9 +27,9 @@
 #include <quorvel/hmievent.h>
 #include <quorvel/hmisignaltransition.h>
 #include <quorvel/hmitransition.h>
+#include <quorvel/hmiviewstate.h>
 #include <quorvel/intsignaltransition.h>
 #include <quorvel/keysignaltransition.h>
-#include <quorvel/hmiviewstate.h>
 #include <quorvel/popupstate.h>
 #include <taldris/hardkeycontroller.h>
 #include <taldris/hmiintentmanager.h>
@@ -58,42 +58,42 @@ struct GlobalPopup
 };
 
 const GlobalPopup globalPopups[] = {
-    { &Views::MissedCallPopup, 5000, 1 },
-    { &Views::CallAnswerNotResponding, 0, 16 },
-    { &Views::IncomingCall, 0, 2 },
-    { &Views::WaitingCall, 0, 3 },
-    { &Views::Redial, 0, 4 },
-    { &Views::CallEnded, 3000, 5 },
-    { &Views::DeviceIssueFixHint, 0, 6 },
-    { &Views::DialingFailed, 0, 8 },
-    { &Views::Dialing3rdFailure, 0, 9 },
-    { &Views::BatteryLow, 0, 11 },
-    { &Views::NoCellularSignal, 3000, 7 },
-    { &Views::RoamingWarning, 0, 10 },
-    { &Views::PhoneConnectionUnstable, 0, 12 },
-    { &Views::PhoneConnectionLost, 0, 13 },
-    { &Views::UnableToConnect, 0, 14 },
-    { &Views::HandsFreeError, 0, 15 },
-    { &Views::MultipleTextMessagesReceived, 8000, 19 },
-    { &Views::NewTextMessageAlert1, 8000, 17 },
-    { &Views::NewTextMessageAlert2, 8000, 18 },
-    { &Views::PhoneSmsSendTextMessage, 0, 20 },
-    { &Views::PhoneSmsSendTextMessageProgress, 0, 22 },
-    { &Views::PhoneSmsSendTextMessageSuccess, 5000, 23 },
-    { &Views::PhoneSmsSendTextMessageFailure, 0, 24 },
-    { &Views::PhoneSmsSendTextMessageNetworkFailure, 0, 25 },
-    { &Views::PhoneSmsRetrySendTextMessageFailure, 0, 26 },
-    { &Views::PhoneSmsSendTextMessageNoResponseFromPhone, 0, 27 },
-    { &Views::DTMFKeyPressNoResponseErrorPopup, 3000, 28 },
-    { &Views::PhoneAudioTransferErrorPopup, 5000, 29 },
-    { &Views::PhoneBookDownloadComplete, 3000, 36 },
-    { &Views::PhoneCallStandByModePopup, 0, 30 },
-    { &Views::PhoneSmsTextMessagingOff, 0, 21 },
-    { &Views::UnstableDeviceConnectionWithKovaPopup, 5000, 31 },
-    { &Views::SiriConnectionNotRespondingPopup, 3000, 32 },
-    { &Views::siriFeatureNotEnabledPopup, 0, 34 },
-    { &Views::PhoneVoiceServiceActivatedPopup, 0, 35 },
-    { &Views::ContactsListTooLargePopup, 0, 33 },
+        {&Views::MissedCallPopup, 5000, 1},
+        {&Views::CallAnswerNotResponding, 0, 16},
+        {&Views::IncomingCall, 0, 2},
+        {&Views::WaitingCall, 0, 3},
+        {&Views::Redial, 0, 4},
+        {&Views::CallEnded, 3000, 5},
+        {&Views::DeviceIssueFixHint, 0, 6},
+        {&Views::DialingFailed, 0, 8},
+        {&Views::Dialing3rdFailure, 0, 9},
+        {&Views::BatteryLow, 0, 11},
+        {&Views::NoCellularSignal, 3000, 7},
+        {&Views::RoamingWarning, 0, 10},
+        {&Views::PhoneConnectionUnstable, 0, 12},
+        {&Views::PhoneConnectionLost, 0, 13},
+        {&Views::UnableToConnect, 0, 14},
+        {&Views::HandsFreeError, 0, 15},
+        {&Views::MultipleTextMessagesReceived, 8000, 19},
+        {&Views::NewTextMessageAlert1, 8000, 17},
+        {&Views::NewTextMessageAlert2, 8000, 18},
+        {&Views::PhoneSmsSendTextMessage, 0, 20},
+        {&Views::PhoneSmsSendTextMessageProgress, 0, 22},
+        {&Views::PhoneSmsSendTextMessageSuccess, 5000, 23},
+        {&Views::PhoneSmsSendTextMessageFailure, 0, 24},
+        {&Views::PhoneSmsSendTextMessageNetworkFailure, 0, 25},
+        {&Views::PhoneSmsRetrySendTextMessageFailure, 0, 26},
+        {&Views::PhoneSmsSendTextMessageNoResponseFromPhone, 0, 27},
+        {&Views::DTMFKeyPressNoResponseErrorPopup, 3000, 28},
+        {&Views::PhoneAudioTransferErrorPopup, 5000, 29},
+        {&Views::PhoneBookDownloadComplete, 3000, 36},
+        {&Views::PhoneCallStandByModePopup, 0, 30},
+        {&Views::PhoneSmsTextMessagingOff, 0, 21},
+        {&Views::UnstableDeviceConnectionWithKovaPopup, 5000, 31},
+        {&Views::SiriConnectionNotRespondingPopup, 3000, 32},
+        {&Views::siriFeatureNotEnabledPopup, 0, 34},
+        {&Views::PhoneVoiceServiceActivatedPopup, 0, 35},
+        {&Views::ContactsListTooLargePopup, 0, 33},
 };
 
 const int globalPopupCount = int(sizeof(globalPopups) / sizeof(globalPopups[0]));
@@ -199,8 +199,8 @@ void HmiPhoneGlobalStateHandler::produceGlobalStateAndTransitions(Phone_Cmp *pho
     listCollectedTransitions(phoneCmp);
 }
 
-HmiPhoneGlobalStateHandler::TransitionList
-HmiPhoneGlobalStateHandler::rootHierarchyTransitions() const
+HmiPhoneGlobalStateHandler::TransitionList HmiPhoneGlobalStateHandler::rootHierarchyTransitions()
+        const
 {
     return m_rootHierarchyTransitions;
 }
@@ -279,8 +279,8 @@ void HmiPhoneGlobalStateHandler::createPopupStates()
     acceptWaiting->setTargetState(accepted);
     connect(acceptWaiting, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::acceptIncomingCall);
-    auto *acceptFailed =
-            new HmiSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, accepted);
+    auto *acceptFailed = new HmiSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, accepted);
     acceptFailed->setTargetState(m_popupsByView.value(Views::CallAnswerNotResponding));
     auto *waitingRemoteRejection = new HmiSignalTransition(
             m_phoneSource, &Mavrosk::PhoneSource::phoneWaitingCallRemoteRejection, nullptr);
@@ -297,8 +297,8 @@ void HmiPhoneGlobalStateHandler::createPopupStates()
     auto *redialCancelled = new HmiTransition(Events::HmiPhone_CancelRedialRequest, redial);
     connect(redialCancelled, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::cancelRedialRequest);
-    auto *callEndConfirmation =
-            new HmiTransition(Events::HmiPhone_CallEndConfirmed, m_popupsByView.value(Views::CallEnded));
+    auto *callEndConfirmation = new HmiTransition(Events::HmiPhone_CallEndConfirmed,
+                                                  m_popupsByView.value(Views::CallEnded));
     connect(callEndConfirmation, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::callEndConfirmed);
 
@@ -330,7 +330,8 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
 
     // The phone rings: two guarded transitions on the same change of "incomingCall" split the
     // start and the end of the ringing; a projection that gives the call back starts it too.
-    m_incomingCallTransition = new GuardedPropertyTransition(m_phoneSource, "incomingCall", nullptr);
+    m_incomingCallTransition
+            = new GuardedPropertyTransition(m_phoneSource, "incomingCall", nullptr);
     connect(m_incomingCallTransition, &GuardedSignalTransition::transitionTest, this,
             &HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest);
     connect(m_incomingCallTransition, &QAbstractTransition::triggered, this,
@@ -346,8 +347,8 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
             &HmiPhoneGlobalStateHandler::incomingCall);
     list(ProjectionNotActive, m_incomingCallOnProjectionDisconnectTransition);
 
-    auto *acceptingFailed =
-            new HmiSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, nullptr);
+    auto *acceptingFailed = new HmiSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, nullptr);
     connect(acceptingFailed, &QAbstractTransition::triggered, m_popupManager,
             &HmiPhonePopupManager::showCallAcceptanceFailure);
     list(CallAcceptingFailed, acceptingFailed);
@@ -359,16 +360,16 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
             &HmiPhoneGlobalStateHandler::incomingCallOutbound);
     list(IncomingCallEnded, m_missedCallTransition);
 
-    auto *multipartyEnded =
-            new HmiSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::multipartyActiveCallEnded, nullptr);
+    auto *multipartyEnded = new HmiSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::multipartyActiveCallEnded, nullptr);
     connect(multipartyEnded, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage);
     connect(multipartyEnded, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::showCallEnded);
     list(MultipartyActiveCallEnded, multipartyEnded);
 
-    auto *missedCalls =
-            new GuardedSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::missedCallsPresent, nullptr);
+    auto *missedCalls = new GuardedSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::missedCallsPresent, nullptr);
     connect(missedCalls, &GuardedSignalTransition::transitionTest, this,
             &HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest);
     connect(missedCalls, &QAbstractTransition::triggered, m_popupManager,
@@ -401,7 +402,7 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
     list(CallConnected, m_callConnectedTransition);
 
     auto *callConnectedNow = new GuardedPropertyChangeTransition(
-            m_phoneSource, "callConnected", { QVariant(false) }, QVariant(true), nullptr);
+            m_phoneSource, "callConnected", {QVariant(false)}, QVariant(true), nullptr);
     connect(callConnectedNow, &QAbstractTransition::triggered, this,
             Brisken::DismissPopup(Views::PhoneSmsDownloading));
     connect(callConnectedNow, &QAbstractTransition::triggered, this,
@@ -413,12 +414,12 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
         int from;
         int to;
         ListPosition position;
-    } outgoingConnected[] = { { 3, 7, OutgoingConnected3To7 },
-                              { 4, 9, OutgoingConnected4To9 },
-                              { 5, 10, OutgoingConnected5To10 },
-                              { 6, 11, OutgoingConnected6To11 } };
+    } outgoingConnected[] = {{3, 7, OutgoingConnected3To7},
+                             {4, 9, OutgoingConnected4To9},
+                             {5, 10, OutgoingConnected5To10},
+                             {6, 11, OutgoingConnected6To11}};
     for (const auto &passage : outgoingConnected) {
-        auto *transition = statusChange({ QVariant(passage.from) }, passage.to);
+        auto *transition = statusChange({QVariant(passage.from)}, passage.to);
         connect(transition, &QAbstractTransition::triggered, this,
                 &HmiPhoneGlobalStateHandler::showPhoneConnectedOutgoingCallTransientMessage);
         // Only a single call getting through clears a dialling failure still on screen.
@@ -439,13 +440,13 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
     connect(issueFix, &QAbstractTransition::triggered, m_popupManager,
             &HmiPhonePopupManager::showDeviceIssueFixHint);
     list(PhoneIssueFixRequest, issueFix);
-    auto *dialingFailed =
-            new IntSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::phoneDialingFailed, 1, nullptr);
+    auto *dialingFailed = new IntSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::phoneDialingFailed, 1, nullptr);
     connect(dialingFailed, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::handleDialingFailure);
     list(DialingFailed1, dialingFailed);
-    auto *noSignal =
-            new IntSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::phoneDialingFailed, 0, nullptr);
+    auto *noSignal = new IntSignalTransition(m_phoneSource,
+                                             &Mavrosk::PhoneSource::phoneDialingFailed, 0, nullptr);
     connect(noSignal, &QAbstractTransition::triggered, m_popupManager,
             &HmiPhonePopupManager::showNoCellularSignal);
     list(DialingFailed0, noSignal);
@@ -489,8 +490,8 @@ void HmiPhoneGlobalStateHandler::createScreenRequestTransitions(Phone_Cmp *phone
     connect(roamingMode, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::handleRoamingWarning);
     list(RoamingModeRequest, roamingMode);
-    auto *roamingReceived =
-            new HmiSignalTransition(m_phoneSource, &Mavrosk::PhoneSource::phoneRoamingModeReceived, nullptr);
+    auto *roamingReceived = new HmiSignalTransition(
+            m_phoneSource, &Mavrosk::PhoneSource::phoneRoamingModeReceived, nullptr);
     connect(roamingReceived, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::handleRoamingWarning);
     list(RoamingModeReceived, roamingReceived);
@@ -642,8 +643,8 @@ void HmiPhoneGlobalStateHandler::onMissedCallPopupExited()
 
 void HmiPhoneGlobalStateHandler::addPhoneRequested()
 {
-    Taldris::HmiIntentManager::instance()->requestAction(14, { QVariant(ModuleName) }, false,
-                                                         false, QVariant());
+    Taldris::HmiIntentManager::instance()->requestAction(14, {QVariant(ModuleName)}, false, false,
+                                                         QVariant());
 }
 
 // Posted through the controller, at normal priority, to the HMI's one machine, like every other

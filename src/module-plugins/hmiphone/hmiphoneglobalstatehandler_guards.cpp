@@ -20,8 +20,7 @@ namespace HmiPhone {
 namespace {
 
 // A guard whose transition is not built leaves nothing to decide.
-template<class Transition>
-void allow(Transition *transition, bool allowed)
+template<class Transition> void allow(Transition *transition, bool allowed)
 {
     if (transition)
         transition->setAllowTransition(allowed);
@@ -115,8 +114,8 @@ void HmiPhoneGlobalStateHandler::phoneMultipartySwitchKeyTransitionEventTest(QEv
 
 void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
 {
-    const bool callInProgress = m_phoneSource->dialingInProgress()
-            || m_phoneSource->callConnected() || m_phoneSource->multipleCallsConnected();
+    const bool callInProgress = m_phoneSource->dialingInProgress() || m_phoneSource->callConnected()
+            || m_phoneSource->multipleCallsConnected();
     allow(m_phoneEndCallKeyTransition,
           !m_phoneSource->privateMode() && callInProgress && !m_phoneSource->incomingCall()
                   && m_projectionSource->projectionMode() == 0);
