@@ -1,6 +1,7 @@
 #include "hmiphoneintegration.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphoneglobalstatehandler.h"
 #include "hmiphoneintenthandler.h"
 #include "hmiphonepopupmanager.h"
 #include "phone_cmp.h"
@@ -84,13 +85,17 @@ QUrl HmiPhoneIntegration::iconUrl() const
 Taldris::HmiModuleIntegration::RootHierarchyTransitions
 HmiPhoneIntegration::moduleRootHierarchyTransitions() const
 {
-    return {};
+    if (!m_globalStateHandler)
+        return {};
+    return m_globalStateHandler->rootHierarchyTransitions();
 }
 
 Taldris::HmiModuleIntegration::RootHierarchyPopupStates
 HmiPhoneIntegration::moduleRootHierarchyPopupStates() const
 {
-    return {};
+    if (!m_globalStateHandler)
+        return {};
+    return m_globalStateHandler->rootHierarchyPopups();
 }
 
 void HmiPhoneIntegration::registerTypes()
@@ -114,6 +119,8 @@ Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiSta
             &HmiPhoneController::phoneMenuExited);
     connect(rootComponent->phoneIdleState(), &QAbstractState::entered, m_controller,
             &HmiPhoneController::phoneMenuEntered);
+    m_globalStateHandler = new HmiPhoneGlobalStateHandler(m_controller, this);
+    m_globalStateHandler->produceGlobalStateAndTransitions(rootComponent);
     if (rootComponent)
         Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
                                                                     2);
