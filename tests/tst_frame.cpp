@@ -10,6 +10,7 @@
 #include <mavrosk/bridge.h>
 #include <quorvel/hmitransition.h>
 #include <quorvel/hmiviewstate.h>
+#include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
 #include <taldris/moduleinterface.h>
 
@@ -217,8 +218,11 @@ void tst_Frame::intentActions()
     host.use(&module);
     QVERIFY(host.setUp(QStringLiteral("HmiPhone")));
     host.start();
-    // Another part of the HMI listening to the events that the phone posts to the machine.
-    QSignalSpy heard(new Quorvel::HmiTransition(what, host.home()),
+    // Another part of the HMI listening to the events that the phone posts to the machine (on a
+    // state that stays active when the phone opens one of its screens).
+    QSignalSpy heard(new Quorvel::HmiTransition(
+                             what, Quorvel::StateMachine::instance()->levelState(
+                                           Quorvel::StateLevel1)),
                      &QAbstractTransition::triggered);
     Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
                                                          connected);

@@ -2,6 +2,7 @@
 
 #include <quorvel/statelevel.h>
 
+#include <QHash>
 #include <QList>
 #include <QObject>
 #include <QPair>
@@ -321,6 +322,8 @@ private:
 
     // Transitions built but not yet listed, by list position.
     QVector<QPair<Quorvel::StateLevel, QAbstractTransition *>> m_collectedTransitions;
+    // The global popup states by view identifier, for the wiring made while building.
+    QHash<QString, Quorvel::PopupState *> m_popupsByView;
 };
 
 } // namespace HmiPhone

@@ -1,8 +1,11 @@
 #include "hmiphoneintegration.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphoneglobalstatehandler.h"
 #include "hmiphoneintenthandler.h"
 #include "hmiphonepopupmanager.h"
+#include "phone_cmp.h"
+#include "phonemenustate.h"
 
 #include <brisken/viewmanager.h>
 #include <mavrosk/bluetoothsource.h>
@@ -82,13 +85,17 @@ QUrl HmiPhoneIntegration::iconUrl() const
 Taldris::HmiModuleIntegration::RootHierarchyTransitions
 HmiPhoneIntegration::moduleRootHierarchyTransitions() const
 {
-    return {};
+    if (!m_globalStateHandler)
+        return {};
+    return m_globalStateHandler->rootHierarchyTransitions();
 }
 
 Taldris::HmiModuleIntegration::RootHierarchyPopupStates
 HmiPhoneIntegration::moduleRootHierarchyPopupStates() const
 {
-    return {};
+    if (!m_globalStateHandler)
+        return {};
+    return m_globalStateHandler->rootHierarchyPopups();
 }
 
 void HmiPhoneIntegration::registerTypes()
@@ -105,8 +112,15 @@ void HmiPhoneIntegration::registerTypes()
 Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
 {
     qCDebug(hmiphone) << Q_FUNC_INFO;
-    Q_UNUSED(parent)
-    Quorvel::HmiState *rootComponent = nullptr;
+    const QString rootStateId = rootStateIdentifier();
+    auto *rootComponent = new Phone_Cmp(this, m_controller, rootStateId, parent);
+    // The phone menu's entry and exit reach the views through the controller.
+    connect(rootComponent->phoneIdleState(), &QAbstractState::exited, m_controller,
+            &HmiPhoneController::phoneMenuExited);
+    connect(rootComponent->phoneIdleState(), &QAbstractState::entered, m_controller,
+            &HmiPhoneController::phoneMenuEntered);
+    m_globalStateHandler = new HmiPhoneGlobalStateHandler(m_controller, this);
+    m_globalStateHandler->produceGlobalStateAndTransitions(rootComponent);
     if (rootComponent)
         Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
                                                                     2);

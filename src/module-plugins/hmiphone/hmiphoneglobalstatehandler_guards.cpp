@@ -1,0 +1,231 @@
+// The guard tests of the global transitions: each reads the phone's data and allows or blocks the
+// transition that asks, just before it would fire.
+
+#include "hmiphoneglobalstatehandler.h"
+
+#include "hmiphonecontroller.h"
+
+#include <brisken/viewmanager.h>
+#include <mavrosk/bluetoothsource.h>
+#include <mavrosk/navsource.h>
+#include <mavrosk/phonesource.h>
+#include <mavrosk/projectionsource.h>
+#include <quorvel/guardedpropertytransition.h>
+#include <quorvel/guardedsignaltransition.h>
+#include <quorvel/hmitransition.h>
+#include <quorvel/keysignaltransition.h>
+
+namespace HmiPhone {
+
+namespace {
+
+// A guard whose transition is not built leaves nothing to decide.
+template<class Transition> void allow(Transition *transition, bool allowed)
+{
+    if (transition)
+        transition->setAllowTransition(allowed);
+}
+
+} // namespace
+
+void HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest(QEvent *)
+{
+    auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
+    if (!transition)
+        return;
+    // A projection that owns the call but does not render it shows its own call screen.
+    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+        transition->setAllowTransition(false);
+        return;
+    }
+    transition->setAllowTransition(!m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall());
+}
+
+void HmiPhoneGlobalStateHandler::incomingCallKeySignalTransitionEventTest(QEvent *)
+{
+    auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
+    if (!transition)
+        return;
+    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+        transition->setAllowTransition(false);
+        return;
+    }
+    transition->setAllowTransition(!m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
+                                   && !m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest(QEvent *)
+{
+    auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
+    if (!transition)
+        return;
+    // A rendering projection tells the driver about missed calls itself.
+    transition->setAllowTransition(
+            !(m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1));
+}
+
+void HmiPhoneGlobalStateHandler::incomingCallonPrjDisconnectTransitionEventTest(QEvent *)
+{
+    allow(m_incomingCallOnProjectionDisconnectTransition,
+          !m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
+                  && Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::missedCallTransitionEventTest(QEvent *)
+{
+    allow(m_missedCallTransition, !m_phoneSource->incomingCall());
+}
+
+void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
+{
+    if (!m_callConnectedTransition)
+        return;
+    const bool callOngoing = m_phoneSource->callConnected() || m_phoneSource->dialingInProgress();
+    const int context = m_viewManager ? m_viewManager->displayContext() : 0;
+    if (context == 5)
+        m_callConnectedTransition->setAllowTransition(!m_navSource->routeActive() && callOngoing);
+    else if (context == 1)
+        m_callConnectedTransition->setAllowTransition(false);
+    else
+        m_callConnectedTransition->setAllowTransition(callOngoing);
+}
+
+void HmiPhoneGlobalStateHandler::redialKeyTransitionEventTest(QEvent *)
+{
+    if (!m_bluetoothSource->deviceConnected())
+        return;
+    allow(m_phoneKeyTransition,
+          m_phoneSource->status() == 0 && m_projectionSource->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::phoneKeyTransitionEventTest(QEvent *)
+{
+    allow(m_phoneKeyTransition,
+          !m_phoneSource->incomingCall() && m_phoneSource->status() == 0
+                  && m_projectionSource->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::phoneMultipartySwitchKeyTransitionEventTest(QEvent *)
+{
+    allow(m_multipartySwitchKeyTransition,
+          !m_phoneSource->privateMode() && m_phoneSource->status() == 9
+                  && m_projectionSource->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
+{
+    const bool callInProgress = m_phoneSource->dialingInProgress() || m_phoneSource->callConnected()
+            || m_phoneSource->multipleCallsConnected();
+    allow(m_phoneEndCallKeyTransition,
+          !m_phoneSource->privateMode() && callInProgress && !m_phoneSource->incomingCall()
+                  && m_projectionSource->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::isProjectionNotActive()
+{
+    auto *transition = qobject_cast<Quorvel::KeySignalTransition *>(sender());
+    if (!transition)
+        return;
+    transition->setAllowTransition(Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+}
+
+void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
+{
+    if (!m_bluetoothSource->deviceConnected())
+        return;
+    allow(m_batteryLevelTransition,
+          m_phoneSource->lowBatteryNotification()
+                  && m_controller->shouldBatteryWarningBeShown(
+                          m_phoneSource->deviceBatteryLevel()));
+}
+
+void HmiPhoneGlobalStateHandler::standbyTransitionEventTest(QEvent *)
+{
+    allow(m_standbyTransition, m_phoneSource->status() == 12);
+}
+
+void HmiPhoneGlobalStateHandler::showPhoneConnectionLostTest(QEvent *)
+{
+    allow(m_connectionLostTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::showPhoneAttemptingReconnectTest(QEvent *)
+{
+    allow(m_attemptingReconnectTransition, !m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::showPhoneDoorOpenLinklossTest(QEvent *)
+{
+    allow(m_doorOpenLinklossTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::showPhoneDoorNoCallOpenLinklossTest(QEvent *)
+{
+    allow(m_doorNoCallOpenLinklossTransition, !m_phoneSource->callConnected());
+}
+
+// The single and the multiple new-message transitions share their signal; the alert state picks
+// exactly one of them, and the other is left at its default (blocked).
+void HmiPhoneGlobalStateHandler::newTextMessageTest(QEvent *)
+{
+    if (m_textMessageAlertState == 0)
+        allow(m_newTextMessageTransition, true);
+}
+
+void HmiPhoneGlobalStateHandler::multipleNewTextMessagesTest(QEvent *)
+{
+    if (m_textMessageAlertState != 0)
+        allow(m_multipleNewTextMessagesTransition, true);
+}
+
+void HmiPhoneGlobalStateHandler::requestedMessageDetailsReadyTest(QEvent *)
+{
+    allow(m_requestedMessageDetailsReadyTransition, m_listenMessageRequested);
+}
+
+void HmiPhoneGlobalStateHandler::smsNewTextHearitEventTest(QEvent *)
+{
+    allow(m_smsNewTextHearItTransition, m_phoneSource->hearItPressed());
+}
+
+void HmiPhoneGlobalStateHandler::dtmfKeyPressNoResponseErrorEventTest(QEvent *)
+{
+    allow(m_dtmfNoResponseErrorTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::phoneAudioTransferErrorEventTest(QEvent *)
+{
+    allow(m_audioTransferErrorTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::phoneAudioHandsfreeErrorEventTest(QEvent *)
+{
+    allow(m_audioHandsfreeErrorTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::phoneAudioInternalErrorEventTest(QEvent *)
+{
+    allow(m_audioInternalErrorTransition, m_phoneSource->callConnected());
+}
+
+void HmiPhoneGlobalStateHandler::smsMessagesInMemoryTest(QEvent *)
+{
+    allow(m_smsInMemoryTransition, m_phoneSource->messagesInMemoryStatus());
+}
+
+void HmiPhoneGlobalStateHandler::smsMessagesNotInMemoryTest(QEvent *)
+{
+    allow(m_smsNotInMemoryTransition, !m_phoneSource->messagesInMemoryStatus());
+}
+
+void HmiPhoneGlobalStateHandler::smsMessageNotificationEnabledTest(QEvent *)
+{
+    allow(m_smsNotificationEnabledTransition, m_phoneSource->messageNotificationEnabled());
+}
+
+void HmiPhoneGlobalStateHandler::smsMessageNotificationNotEnabledTest(QEvent *)
+{
+    allow(m_smsNotificationDisabledTransition, !m_phoneSource->messageNotificationEnabled());
+}
+
+} // namespace HmiPhone
