@@ -1,332 +1,214 @@
-#include "phonescreenfixture.h"
+#include "phonerootfixture.h"
 
 #include <hmiphoneevents.h>
 #include <hmiphoneviews.h>
 
-#include <mavrosk/ardelsource.h>
-#include <mavrosk/bluetoothsource.h>
-#include <mavrosk/phonesource.h>
-#include <mavrosk/speechsource.h>
+#include <mavrosk/bridge.h>
 
 #include <QtTest>
 
 using namespace HmiPhone;
+using namespace PhoneRootFixture;
 
 class TestPhoneRoot : public QObject
 {
     Q_OBJECT
 
 private slots:
-    void init()
-    {
-        m_fixture.reset();
-        TestSupport::FrameworkWarningGuard::take();
-    }
     void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
-
     void firstScreen_data();
     void firstScreen();
-    void firstScreenIsChosenOnEveryEntry();
-    void siriRequest_data();
-    void siriRequest();
-    void doNotDisturbToggle_data();
-    void doNotDisturbToggle();
-    void callEnded_data();
-    void callEnded();
-    void phoneWideTransitions_data();
-    void phoneWideTransitions();
-    void makeCall_data();
-    void makeCall();
+    void navigation_data();
+    void navigation();
+    void actions_data();
+    void actions();
 
 private:
-    Mavrosk::PhoneSource *phone() const { return Mavrosk::PhoneSource::instance(); }
-    void connectDevice(bool connected = true)
-    {
-        Mavrosk::BluetoothSource::instance()->setDeviceConnected(connected);
-    }
-
     TestSupport::FrameworkWarningGuard m_guard;
-    PhoneScreenFixture m_fixture;
 };
 
-static const QStringList FirstScreens
-        = {QStringLiteral("HmiPhone_Limbo"), QStringLiteral("PhoneCallCmp"),
-           QStringLiteral("PhoneEmgcyAsst"), QStringLiteral("PhoneMenuViewState")};
+static const QString Connected = QStringLiteral("bluetooth.deviceConnected=true ");
 
 void TestPhoneRoot::firstScreen_data()
 {
-    QTest::addColumn<bool>("connected");
-    QTest::addColumn<int>("status");
-    QTest::addColumn<bool>("callConnected");
-    QTest::addColumn<int>("emergency");
+    QTest::addColumn<QString>("data");
     QTest::addColumn<QString>("expected");
 
-    const QString addPhone = QStringLiteral("HmiPhone_Limbo");
-    const QString call = QStringLiteral("PhoneCallCmp");
-    const QString emergency = QStringLiteral("PhoneEmgcyAsst");
-    const QString menu = QStringLiteral("PhoneMenuViewState");
-
-    QTest::addRow("no device") << false << 0 << false << 0 << addPhone;
-    QTest::addRow("no device, call reported") << false << 4 << true << 1 << addPhone;
-    QTest::addRow("idle") << true << 0 << false << 0 << menu;
-    QTest::addRow("status 2 is no call") << true << 2 << false << 0 << menu;
-    QTest::addRow("status 3") << true << 3 << false << 0 << call;
-    QTest::addRow("status 5") << true << 5 << false << 0 << call;
-    QTest::addRow("status 6 alone is no call") << true << 6 << false << 0 << menu;
-    QTest::addRow("call connected at status 7") << true << 7 << true << 0 << call;
-    QTest::addRow("status 4, emergency 1: call wins") << true << 4 << false << 1 << call;
-    QTest::addRow("connected call, emergency 2: call wins") << true << 0 << true << 2 << call;
-    QTest::addRow("emergency 1") << true << 0 << false << 1 << emergency;
-    QTest::addRow("emergency 2") << true << 0 << false << 2 << emergency;
-    QTest::addRow("emergency 3 is none") << true << 0 << false << 3 << menu;
+    const QString addPhone = QStringLiteral("HmiPhone_Limbo"),
+                  call = QStringLiteral("PhoneCallCmp"), sos = QStringLiteral("PhoneEmgcyAsst"),
+                  menu = QStringLiteral("PhoneMenuViewState");
+    QTest::addRow("no device") << QString() << addPhone;
+    QTest::addRow("no device, call reported")
+            << "phone.status=4 phone.callConnected=true"_q << addPhone;
+    QTest::addRow("idle") << Connected << menu;
+    QTest::addRow("status 2 is no call") << Connected + "phone.status=2"_q << menu;
+    QTest::addRow("status 3") << Connected + "phone.status=3"_q << call;
+    QTest::addRow("status 5") << Connected + "phone.status=5"_q << call;
+    QTest::addRow("status 6 alone is no call") << Connected + "phone.status=6"_q << menu;
+    QTest::addRow("call connected") << Connected + "phone.callConnected=true"_q << call;
+    QTest::addRow("status 4, emergency 1: the call wins")
+            << Connected + "phone.status=4 phone.emergencyCallStatus=1"_q << call;
+    QTest::addRow("emergency 1") << Connected + "phone.emergencyCallStatus=1"_q << sos;
+    QTest::addRow("emergency 2") << Connected + "phone.emergencyCallStatus=2"_q << sos;
+    QTest::addRow("emergency 3 is none") << Connected + "phone.emergencyCallStatus=3"_q << menu;
 }
 
 void TestPhoneRoot::firstScreen()
 {
-    QFETCH(bool, connected);
-    QFETCH(int, status);
-    QFETCH(bool, callConnected);
-    QFETCH(int, emergency);
+    QFETCH(QString, data);
     QFETCH(QString, expected);
 
-    connectDevice(connected);
-    phone()->setStatus(status);
-    phone()->setCallConnected(callConnected);
-    phone()->setEmergencyCallStatus(emergency);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
+    Phone_Cmp *phone = build();
+    // The choice is made on every entry, from the data of that moment.
+    for (const QString &screen : {QStringLiteral("HmiPhone_Limbo"), expected}) {
+        ScreenFixture::post(ScreenFixture::OpenHome);
+        setValues(screen == expected ? data : QString());
+        const qint64 since = ScreenFixture::mark();
+        enter(phone);
 
-    for (const QString &screen : FirstScreens)
-        QCOMPARE(m_fixture.isActive(screen), screen == expected);
-
-    // The phone is asked for its status only when a device is connected; without one the
-    // platform is asked to add a phone.
-    QCOMPARE(m_fixture.bridgeCalls().contains(QStringLiteral("phone.checkPhoneStatus()")),
-             connected);
-    QCOMPARE(m_fixture.journal(QStringLiteral("intent"), QStringLiteral("action")),
-             connected ? QStringList() : QStringList{QStringLiteral("70")});
+        const QStringList active = ScreenFixture::activeStates();
+        for (const QString &name :
+             {QStringLiteral("HmiPhone_Limbo"), QStringLiteral("PhoneCallCmp"),
+              QStringLiteral("PhoneEmgcyAsst"), QStringLiteral("PhoneMenuViewState")})
+            QVERIFY2(active.contains(name) == (name == screen), qPrintable(name));
+        // Without a device the platform is asked to add a phone; with one, the phone for its
+        // status.
+        const bool connected = Mavrosk::BluetoothSource::instance()->deviceConnected();
+        QCOMPARE(outputs(since).contains(QStringLiteral("phone.checkPhoneStatus()")), connected);
+        QCOMPARE(outputs(since).contains(QStringLiteral("intent 70")), !connected);
+    }
 }
 
-void TestPhoneRoot::firstScreenIsChosenOnEveryEntry()
+// Steps before the last one lead to the screen the last one starts from: events, "status=N"_q,
+// and the phone's reports "reconnect failed" and "notification on".
+void TestPhoneRoot::navigation_data()
 {
-    connectDevice();
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    QVERIFY(m_fixture.isActive(QStringLiteral("PhoneMenuViewState")));
-
-    m_fixture.enter(m_fixture.home());
-    phone()->setStatus(4);
-    m_fixture.enter(m_fixture.phone());
-    QVERIFY(m_fixture.isActive(QStringLiteral("CallInProgressViewState")));
-}
-
-void TestPhoneRoot::siriRequest_data()
-{
-    QTest::addColumn<bool>("connected");
-    QTest::addColumn<bool>("supported");
-    QTest::addColumn<bool>("enabled");
-    QTest::addColumn<bool>("siriActive");
-    QTest::addColumn<int>("session");
-    QTest::addColumn<QStringList>("calls");
-    QTest::addColumn<QStringList>("popups");
-
-    const QStringList refused{Views::siriFeatureNotEnabledPopup};
-    QTest::addRow("activate") << true << true << true << false << 0
-                              << QStringList{QStringLiteral("phone.toggleSiriActivation(true)")}
-                              << QStringList();
-    QTest::addRow("deactivate during a voice session")
-            << true << true << true << true << 3
-            << QStringList{QStringLiteral("speech.cancelVRSession()"),
-                           QStringLiteral("phone.toggleSiriActivation(false)")}
-            << QStringList();
-    QTest::addRow("unsupported") << true << false << true << false << 0 << QStringList() << refused;
-    QTest::addRow("disabled") << true << true << false << false << 0 << QStringList() << refused;
-    QTest::addRow("no device") << false << true << true << false << 0 << QStringList() << refused;
-}
-
-void TestPhoneRoot::siriRequest()
-{
-    QFETCH(bool, connected);
-    QFETCH(bool, supported);
-    QFETCH(bool, enabled);
-    QFETCH(bool, siriActive);
-    QFETCH(int, session);
-    QFETCH(QStringList, calls);
-    QFETCH(QStringList, popups);
-
-    connectDevice(connected);
-    phone()->setSiriSupported(supported);
-    phone()->setSiriEnabled(enabled);
-    phone()->setSiriActive(siriActive);
-    Mavrosk::SpeechSource::instance()->setSessionState(session);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    m_fixture.mark();
-
-    m_fixture.post(Events::HmiPhone_SiriRequest);
-    QCOMPARE(m_fixture.bridgeCalls(), calls);
-    QCOMPARE(m_fixture.journal(QStringLiteral("popup-request")), popups);
-}
-
-void TestPhoneRoot::doNotDisturbToggle_data()
-{
-    QTest::addColumn<bool>("doNotDisturb");
-    QTest::addColumn<int>("keyType");
-    QTest::addColumn<bool>("option");
-    QTest::addColumn<QStringList>("calls");
-    QTest::addColumn<QStringList>("popups");
-
-    const QStringList enable{QStringLiteral("phone.enableDoNotDisturb()")};
-    const QStringList disable{QStringLiteral("phone.disableDoNotDisturb()")};
-    QTest::addRow("off, restricted key") << false << 2 << false << enable << QStringList();
-    QTest::addRow("on, ordinary key") << true << 0 << false << disable << QStringList();
-    QTest::addRow("on, restricted key allowing it")
-            << true << 2 << true << disable << QStringList();
-    QTest::addRow("on, restricted key forbidding it")
-            << true << 2 << false << QStringList() << QStringList{Views::PhoneDndActiveArdel};
-}
-
-void TestPhoneRoot::doNotDisturbToggle()
-{
-    QFETCH(bool, doNotDisturb);
-    QFETCH(int, keyType);
-    QFETCH(bool, option);
-    QFETCH(QStringList, calls);
-    QFETCH(QStringList, popups);
-
-    connectDevice();
-    phone()->setDoNotDisturb(doNotDisturb);
-    Mavrosk::ArdelSource::instance()->setIgnitionKeyType(keyType);
-    Mavrosk::ArdelSource::instance()->setDoNotDisturbOption(option);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    m_fixture.mark();
-
-    m_fixture.post(Events::HmiPhone_DoNotDisturbToggleRequest);
-    QCOMPARE(m_fixture.bridgeCalls(), calls);
-    QCOMPARE(m_fixture.journal(QStringLiteral("popup-request")), popups);
-    // The popup belongs to the phone's own layer: it is shown while the phone is.
-    QCOMPARE(m_fixture.journal(QStringLiteral("popup-shown")), popups);
-}
-
-void TestPhoneRoot::callEnded_data()
-{
-    QTest::addColumn<int>("from");
-    QTest::addColumn<int>("to");
-    QTest::addColumn<int>("backSteps");
-
-    QTest::addRow("5 to 3: still a call") << 5 << 3 << 0;
-    QTest::addRow("3 to 2: ended") << 3 << 2 << 1;
-    QTest::addRow("4 to 0: ended") << 4 << 0 << 1;
-}
-
-void TestPhoneRoot::callEnded()
-{
-    QFETCH(int, from);
-    QFETCH(int, to);
-    QFETCH(int, backSteps);
-
-    connectDevice();
-    phone()->setStatus(from);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    QVERIFY(m_fixture.isActive(QStringLiteral("PhoneCallCmp")));
-    m_fixture.mark();
-
-    phone()->setStatus(to);
-    TestSupport::processUntilIdle();
-    QCOMPARE(m_fixture.journal(QStringLiteral("back"), QStringLiteral("steps")),
-             backSteps ? QStringList{QString::number(backSteps)} : QStringList());
-}
-
-// How the phone-wide transitions act, by the screen they start from.
-void TestPhoneRoot::phoneWideTransitions_data()
-{
-    QTest::addColumn<int>("status");
-    QTest::addColumn<bool>("onKeypad");
-    QTest::addColumn<QString>("trigger");
+    QTest::addColumn<QString>("data");
+    QTest::addColumn<QStringList>("steps");
     QTest::addColumn<QString>("expected");
-    QTest::addColumn<bool>("textMessagesRequested");
+    QTest::addColumn<QString>("outputs");
 
-    const QString menu = QStringLiteral("PhoneMenuViewState");
-    const QString keypad = QStringLiteral("DialKeypadViewState");
-    const QString call = QStringLiteral("CallInProgressViewState");
-    const QString recent = QStringLiteral("RecentCallsListViewState");
-    const QString addPhone = QStringLiteral("HmiPhone_Limbo");
-    const QString keypadRequest = Events::HmiPhone_ShowPhoneKeyPadRequest;
-    const QString recentRequest = Events::HmiPhone_ShowRecentCallsRequest;
-    const QString reconnectFailed = QStringLiteral("reconnect failed");
+    const QString keypad = Events::HmiPhone_ShowPhoneKeyPadRequest;
+    const QString recent = Events::HmiPhone_ShowRecentCallsRequest;
     const QString notification = QStringLiteral("notification on");
-
-    QTest::addRow("keypad from the menu") << 0 << false << keypadRequest << keypad << false;
-    QTest::addRow("keypad not from the call") << 4 << false << keypadRequest << call << false;
-    QTest::addRow("recent calls from the call") << 4 << false << recentRequest << recent << false;
-    QTest::addRow("recent calls from the keypad") << 0 << true << recentRequest << recent << false;
-    QTest::addRow("reconnection failed in a call")
-            << 4 << false << reconnectFailed << addPhone << false;
-    QTest::addRow("notification on in the menu") << 0 << false << notification << menu << true;
-    QTest::addRow("notification on in the keypad") << 0 << true << notification << keypad << false;
+    const QString inCall = Connected + "phone.status=4"_q;
+    QTest::addRow("keypad from the menu")
+            << Connected << QStringList{keypad} << "DialKeypadViewState"_q
+            << ""_q;
+    QTest::addRow("no keypad from the call")
+            << inCall << QStringList{keypad} << "CallInProgressViewState"_q
+            << ""_q;
+    QTest::addRow("recent calls from the call")
+            << inCall << QStringList{recent} << "RecentCallsListViewState"_q
+            << ""_q;
+    QTest::addRow("recent calls from the keypad")
+            << Connected << QStringList{keypad, recent} << "RecentCallsListViewState"_q
+            << ""_q;
+    QTest::addRow("reconnection failed during a call")
+            << inCall << QStringList{"reconnect failed"_q} << "HmiPhone_Limbo"_q
+            << "intent 70"_q;
+    QTest::addRow("notification on in the menu")
+            << Connected << QStringList{notification} << "PhoneMenuViewState"_q
+            << "event HmiPhone_ShowSmsRequest"_q;
+    QTest::addRow("notification on in the keypad")
+            << Connected << QStringList{keypad, notification} << "DialKeypadViewState"_q
+            << ""_q;
+    QTest::addRow("status 5 to 3: the call goes on")
+            << Connected + "phone.status=5"_q << QStringList{"status=3"_q}
+            << "CallInProgressViewState"_q
+            << ""_q;
+    QTest::addRow("status 3 to 2: the call ended")
+            << Connected + "phone.status=3"_q << QStringList{"status=2"_q} << "HostHome"_q
+            << "back 1"_q;
 }
 
-void TestPhoneRoot::phoneWideTransitions()
+void TestPhoneRoot::navigation()
 {
-    QFETCH(int, status);
-    QFETCH(bool, onKeypad);
-    QFETCH(QString, trigger);
+    QFETCH(QString, data);
+    QFETCH(QStringList, steps);
     QFETCH(QString, expected);
-    QFETCH(bool, textMessagesRequested);
+    QFETCH(QString, outputs);
 
-    connectDevice();
-    phone()->setStatus(status);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    if (onKeypad)
-        m_fixture.post(Events::HmiPhone_ShowPhoneKeyPadRequest);
-    m_fixture.mark();
+    enter(build(data));
+    qint64 since = 0;
+    for (const QString &step : steps) {
+        since = ScreenFixture::mark();
+        if (step.startsWith(QLatin1String("status=")))
+            setValues(QStringLiteral("phone.") + step);
+        else if (step == QLatin1String("reconnect failed"))
+            emit Mavrosk::PhoneSource::instance()
+                    ->phoneDriverDoorOpenLinkLossReconnectFailedReceived();
+        else if (step == QLatin1String("notification on"))
+            setValues(QStringLiteral("phone.messageNotificationEnabled=true"));
+        else
+            ScreenFixture::post(step);
+        TestSupport::processUntilIdle();
+    }
+    QVERIFY2(ScreenFixture::activeStates().contains(expected), qPrintable(expected));
+    const QRegularExpression navigationOutputs(QStringLiteral("^(intent|event|back) "));
+    QCOMPARE(PhoneRootFixture::outputs(since).filter(navigationOutputs).join(QLatin1String("; ")),
+             outputs);
+}
 
-    if (trigger == QLatin1String("reconnect failed"))
-        emit phone()->phoneDriverDoorOpenLinkLossReconnectFailedReceived();
-    else if (trigger == QLatin1String("notification on"))
-        phone()->setMessageNotificationEnabled(true);
+// The phone-wide requests: Siri, do-not-disturb and dialling.
+void TestPhoneRoot::actions_data()
+{
+    QTest::addColumn<QString>("data");
+    QTest::addColumn<QString>("request");
+    QTest::addColumn<QString>("outputs");
+
+    const QString siri = Events::HmiPhone_SiriRequest,
+                  dnd = Events::HmiPhone_DoNotDisturbToggleRequest,
+                  call = QStringLiteral("makeCall");
+    const QString siriOk = Connected + "phone.siriSupported=true phone.siriEnabled=true"_q;
+    const QString refused = QStringLiteral("popup ") + Views::siriFeatureNotEnabledPopup;
+    const QString number = Connected + "phone.callNumberEntered=0123"_q;
+    const QString dial = QStringLiteral("phone.dialNumber(0123)");
+
+    QTest::addRow("Siri activated") << siriOk << siri << "phone.toggleSiriActivation(true)"_q;
+    QTest::addRow("Siri deactivated, voice session cancelled")
+            << siriOk + " phone.siriActive=true speech.sessionState=3"_q << siri
+            << "speech.cancelVRSession(); phone.toggleSiriActivation(false)"_q;
+    QTest::addRow("Siri unsupported") << Connected + "phone.siriEnabled=true"_q << siri << refused;
+    QTest::addRow("Siri disabled") << Connected + "phone.siriSupported=true"_q << siri << refused;
+    QTest::addRow("Siri without a device") << siriOk.mid(Connected.size()) << siri << refused;
+    QTest::addRow("DND on, whatever the key")
+            << Connected + "ardel.ignitionKeyType=2"_q << dnd << "phone.enableDoNotDisturb()"_q;
+    QTest::addRow("DND off") << Connected + "phone.doNotDisturb=true"_q << dnd
+                             << "phone.disableDoNotDisturb()"_q;
+    QTest::addRow("DND off, allowed by the restricted key")
+            << Connected
+                    + "phone.doNotDisturb=true ardel.ignitionKeyType=2 ardel.doNotDisturbOption=true"_q
+            << dnd << "phone.disableDoNotDisturb()"_q;
+    QTest::addRow("DND off, forbidden by the restricted key")
+            << Connected + "phone.doNotDisturb=true ardel.ignitionKeyType=2"_q << dnd
+            << QStringLiteral("popup ") + Views::PhoneDndActiveArdel;
+    QTest::addRow("dial") << number << call << dial;
+    QTest::addRow("dial roaming, warning off") << number + " phone.roaming=true"_q << call << dial;
+    QTest::addRow("dial roaming, warning on")
+            << number + " phone.roaming=true phone.roamingWarning=true"_q << call
+            << QStringLiteral("popup ") + Views::RoamingWarning;
+}
+
+void TestPhoneRoot::actions()
+{
+    QFETCH(QString, data);
+    QFETCH(QString, request);
+    QFETCH(QString, outputs);
+
+    Phone_Cmp *phone = build(data);
+    enter(phone);
+    const qint64 since = ScreenFixture::mark();
+    if (request == QLatin1String("makeCall"))
+        phone->makeCall();
     else
-        m_fixture.post(trigger);
-    TestSupport::processUntilIdle();
-
-    QVERIFY2(m_fixture.isActive(expected), qPrintable(expected));
-    QCOMPARE(m_fixture.journal(QStringLiteral("event"), QStringLiteral("name"))
-                     .contains(Events::HmiPhone_ShowSmsRequest),
-             textMessagesRequested);
-}
-
-void TestPhoneRoot::makeCall_data()
-{
-    QTest::addColumn<bool>("roaming");
-    QTest::addColumn<bool>("warning");
-    QTest::addColumn<QStringList>("calls");
-    QTest::addColumn<QStringList>("popups");
-
-    const QStringList dial{QStringLiteral("phone.dialNumber(0123)")};
-    QTest::addRow("home network") << false << true << dial << QStringList();
-    QTest::addRow("roaming, warning off") << true << false << dial << QStringList();
-    QTest::addRow("roaming, warning on")
-            << true << true << QStringList() << QStringList{Views::RoamingWarning};
-}
-
-void TestPhoneRoot::makeCall()
-{
-    QFETCH(bool, roaming);
-    QFETCH(bool, warning);
-    QFETCH(QStringList, calls);
-    QFETCH(QStringList, popups);
-
-    connectDevice();
-    phone()->setRoaming(roaming);
-    phone()->setBridgeValue(QStringLiteral("roamingWarning"), warning);
-    phone()->setBridgeValue(QStringLiteral("callNumberEntered"), QStringLiteral("0123"));
-    m_fixture.build();
-    m_fixture.phone()->makeCall();
-    QCOMPARE(m_fixture.bridgeCalls(), calls);
-    QCOMPARE(m_fixture.journal(QStringLiteral("popup-request")), popups);
+        ScreenFixture::post(request);
+    QCOMPARE(PhoneRootFixture::outputs(since).join(QLatin1String("; ")), outputs);
+    // The do-not-disturb popup belongs to the phone's own layer and shows while the phone does.
+    if (outputs.endsWith(Views::PhoneDndActiveArdel))
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-shown"), QStringLiteral("id"),
+                                            since),
+                 QStringList{Views::PhoneDndActiveArdel});
 }
 
 QTEST_GUILESS_MAIN(TestPhoneRoot)

@@ -1,4 +1,4 @@
-#include "phonescreenfixture.h"
+#include "phonerootfixture.h"
 
 #include <hmiphoneevents.h>
 #include <hmiphonepopupmanager.h>
@@ -6,27 +6,19 @@
 #include <phonemenustate.h>
 #include <phonesms_cmp.h>
 
-#include <mavrosk/bluetoothsource.h>
-#include <mavrosk/phonesource.h>
+#include <mavrosk/bridge.h>
 
 #include <QtTest>
 
 using namespace HmiPhone;
+using namespace PhoneRootFixture;
 
 class TestTextMessages : public QObject
 {
     Q_OBJECT
 
 private slots:
-    void init()
-    {
-        m_fixture.reset();
-        TestSupport::FrameworkWarningGuard::take();
-        Mavrosk::BluetoothSource::instance()->setDeviceConnected(true);
-        phone()->setTextMessageBody(QStringLiteral("See you at six"));
-    }
     void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
-
     void openOrHear_data();
     void openOrHear();
     void downloadRetries_data();
@@ -35,207 +27,184 @@ private slots:
     void inboxRequests();
 
 private:
-    Mavrosk::PhoneSource *phone() const { return Mavrosk::PhoneSource::instance(); }
-    void openMessageList()
+    Phone_Cmp *openMessageList(bool inboxEmpty)
     {
-        m_fixture.enter(m_fixture.phone()->phoneSmsCompositeState());
-        QVERIFY(m_fixture.isActive(QStringLiteral("PhoneSmsListViewState")));
+        Phone_Cmp *phone = build(
+                QStringLiteral("bluetooth.deviceConnected=true phone.textMessageBody=At_six "
+                               "phone.messagesInboxEmptyStatus=")
+                + QLatin1String(inboxEmpty ? "true" : "false"));
+        enter(phone->phoneIdleState());
+        enter(phone->phoneSmsCompositeState());
+        return phone;
     }
+    static Mavrosk::PhoneSource *source() { return Mavrosk::PhoneSource::instance(); }
 
     TestSupport::FrameworkWarningGuard m_guard;
-    PhoneScreenFixture m_fixture;
 };
 
-// Selections made in the list ("hear:<index>" or "options:<index>", the index possibly missing
-// or not a number), then the phone reports the details of the message.
+// Selections in the list ("hear:<index>" or "options:<index>"), then the phone reports the
+// details: the last selection decides between reading aloud and opening the message.
 void TestTextMessages::openOrHear_data()
 {
     QTest::addColumn<QStringList>("selections");
-    QTest::addColumn<QStringList>("calls");
-    QTest::addColumn<bool>("messageViewShown");
+    QTest::addColumn<QStringList>("outputs");
+    QTest::addColumn<QString>("screen");
 
     const QString details2 = QStringLiteral("phone.requestSelectedTextMessageDetails(2)");
     const QString details3 = QStringLiteral("phone.requestSelectedTextMessageDetails(3)");
-    const QString playback = QStringLiteral("phone.textMessagePlayback(See you at six)");
+    const QString playback = QStringLiteral("phone.textMessagePlayback(At_six)");
+    const QString list = QStringLiteral("PhoneSmsListViewState");
+    const QString message = QStringLiteral("PhoneSmsViewState");
+    auto steps = [](const char *text) { return QString::fromLatin1(text).split(QLatin1Char(' ')); };
 
     QTest::addRow("options open the message")
-            << QStringList{QStringLiteral("options:3")} << QStringList{details3} << true;
-    QTest::addRow("hear reads it aloud, the list stays")
-            << QStringList{QStringLiteral("hear:2")} << QStringList{details2, playback} << false;
-    QTest::addRow("hear, then options before the details")
-            << QStringList{QStringLiteral("hear:2"), QStringLiteral("options:3")}
-            << QStringList{details2, details3} << true;
-    QTest::addRow("options, then hear before the details")
-            << QStringList{QStringLiteral("options:3"), QStringLiteral("hear:2")}
-            << QStringList{details3, details2, playback} << false;
-    QTest::addRow("options without an index still cancel hearing")
-            << QStringList{QStringLiteral("hear:2"), QStringLiteral("options:")}
-            << QStringList{details2} << true;
+            << steps("options:3") << QStringList{details3} << message;
+    QTest::addRow("hear reads aloud") << steps("hear:2") << QStringList{details2, playback} << list;
+    QTest::addRow("hear, then options")
+            << steps("hear:2 options:3") << QStringList{details2, details3} << message;
+    QTest::addRow("options, then hear")
+            << steps("options:3 hear:2") << QStringList{details3, details2, playback} << list;
+    QTest::addRow("options without index cancel hearing")
+            << steps("hear:2 options:") << QStringList{details2} << message;
     QTest::addRow("hear with a bad index changes nothing")
-            << QStringList{QStringLiteral("options:3"), QStringLiteral("hear:two")}
-            << QStringList{details3} << true;
-    QTest::addRow("negative index asks nothing")
-            << QStringList{QStringLiteral("hear:-1")} << QStringList() << true;
+            << steps("options:3 hear:two") << QStringList{details3} << message;
+    QTest::addRow("a negative index asks nothing") << steps("hear:-1") << QStringList() << message;
 }
 
 void TestTextMessages::openOrHear()
 {
     QFETCH(QStringList, selections);
-    QFETCH(QStringList, calls);
-    QFETCH(bool, messageViewShown);
+    QFETCH(QStringList, outputs);
+    QFETCH(QString, screen);
 
-    phone()->setMessagesInboxEmptyStatus(true);
-    m_fixture.build();
-    openMessageList();
-    m_fixture.mark();
-
+    openMessageList(true);
+    qint64 since = ScreenFixture::mark();
     for (const QString &selection : selections) {
-        const QString kind = selection.section(QLatin1Char(':'), 0, 0);
         const QString index = selection.section(QLatin1Char(':'), 1);
         bool isNumber = false;
         const int number = index.toInt(&isNumber);
-        const QVariant value = index.isEmpty() ? QVariant()
-                : isNumber                     ? QVariant(number)
-                                               : QVariant(index);
-        m_fixture.post(kind == QLatin1String("hear") ? Events::HmiPhone_HearSelectedTextMessage
-                                                     : Events::HmiPhoneSms_ViewTextMessageOptions,
-                       value);
+        ScreenFixture::post(selection.startsWith(QLatin1String("hear"))
+                                    ? Events::HmiPhone_HearSelectedTextMessage
+                                    : Events::HmiPhoneSms_ViewTextMessageOptions,
+                            index.isEmpty()    ? QVariant()
+                                    : isNumber ? QVariant(number)
+                                               : QVariant(index));
     }
-    emit phone()->textMessageDetailsReady();
+    emit source()->textMessageDetailsReady();
     TestSupport::processUntilIdle();
+    QCOMPARE(PhoneRootFixture::outputs(since), outputs);
+    QVERIFY(ScreenFixture::activeStates().contains(screen));
 
-    QCOMPARE(m_fixture.bridgeCalls(), calls);
-    QCOMPARE(m_fixture.isActive(QStringLiteral("PhoneSmsViewState")), messageViewShown);
-    QCOMPARE(m_fixture.isActive(QStringLiteral("PhoneSmsListViewState")), !messageViewShown);
-
-    // Details arriving while the message itself is shown belong to no selection of the list.
-    if (messageViewShown) {
-        m_fixture.mark();
-        emit phone()->textMessageDetailsReady();
-        TestSupport::processUntilIdle();
-        QCOMPARE(m_fixture.bridgeCalls(), QStringList());
-    }
+    // Reading aloud is asked once: details arriving again open the message; details arriving
+    // while a message is shown belong to no selection of the list.
+    since = ScreenFixture::mark();
+    emit source()->textMessageDetailsReady();
+    TestSupport::processUntilIdle();
+    QCOMPARE(PhoneRootFixture::outputs(since), QStringList());
+    QVERIFY(ScreenFixture::activeStates().contains(QStringLiteral("PhoneSmsViewState")));
 }
 
-// Each failure of a download shown with the downloading popup; the user retries from the
-// download-failed popup. A finished download starts the count again.
+// Downloads started from the list that end "fail" or "done"; after each failure the user asks for
+// a retry. Two retries are offered, and a finished download starts the count again.
 void TestTextMessages::downloadRetries_data()
 {
     QTest::addColumn<QStringList>("outcomes");
-    QTest::addColumn<QStringList>("failurePopups");
+    QTest::addColumn<QStringList>("popups");
 
-    const QString failed = Views::PhoneSmsDownloadFailed;
-    const QString final = Views::PhoneSmsRetryDownloadFailed;
+    const QString failed = Views::PhoneSmsDownloadFailed,
+                  final = Views::PhoneSmsRetryDownloadFailed;
     QTest::addRow("two retries, then the final popup")
-            << QStringList{QStringLiteral("fail"), QStringLiteral("fail"), QStringLiteral("fail"),
-                           QStringLiteral("fail")}
+            << QString::fromLatin1("fail fail fail fail").split(QLatin1Char(' '))
             << QStringList{failed, failed, final, final};
     QTest::addRow("a finished download starts again")
-            << QStringList{QStringLiteral("fail"), QStringLiteral("fail"), QStringLiteral("fail"),
-                           QStringLiteral("done"), QStringLiteral("fail")}
+            << QString::fromLatin1("fail fail fail done fail").split(QLatin1Char(' '))
             << QStringList{failed, failed, final, failed};
 }
 
 void TestTextMessages::downloadRetries()
 {
     QFETCH(QStringList, outcomes);
-    QFETCH(QStringList, failurePopups);
+    QFETCH(QStringList, popups);
 
-    m_fixture.build();
-    openMessageList();
-
+    openMessageList(false);
     QStringList shown;
     for (const QString &outcome : outcomes) {
-        phone()->setMessagesDownloadingStatus(0);
-        m_fixture.post(Events::HmiPhoneSms_RefreshMessages);
-        phone()->setMessagesDownloadingStatus(2);
+        source()->setMessagesDownloadingStatus(0);
+        ScreenFixture::post(Events::HmiPhoneSms_RefreshMessages);
+        source()->setMessagesDownloadingStatus(2);
         TestSupport::processUntilIdle();
         QCOMPARE(Quorvel::StateMachine::instance()->shownPopups(),
                  QStringList{Views::PhoneSmsDownloading});
-        m_fixture.mark();
 
-        phone()->setMessagesDownloadingStatus(outcome == QLatin1String("done") ? 3 : 4);
+        source()->setMessagesDownloadingStatus(outcome == QLatin1String("done") ? 3 : 4);
         TestSupport::processUntilIdle();
+        const QStringList now = Quorvel::StateMachine::instance()->shownPopups();
+        QVERIFY(ScreenFixture::activeStates().contains(QStringLiteral("PhoneSmsListViewState")));
         if (outcome == QLatin1String("done")) {
-            QCOMPARE(m_fixture.journal(QStringLiteral("popup-dismiss")),
-                     QStringList{Views::PhoneSmsDownloading});
-            QVERIFY(m_fixture.isActive(QStringLiteral("PhoneSmsListViewState")));
+            QCOMPARE(now, QStringList());
             continue;
         }
-        const QStringList requested = m_fixture.journal(QStringLiteral("popup-request"));
-        QCOMPARE(requested.size(), 1);
-        shown.append(requested.first());
-        QCOMPARE(Quorvel::StateMachine::instance()->shownPopups(), requested);
+        QCOMPARE(now.size(), 1);
+        shown.append(now.first());
 
-        // Retry from the download-failed popup (the final one offers none).
-        m_fixture.mark();
-        m_fixture.post(Events::HmiPhoneSms_RetryMessagesDownload);
-        if (requested.first() == Views::PhoneSmsDownloadFailed)
-            QCOMPARE(m_fixture.bridgeCalls(),
-                     QStringList{QStringLiteral("phone.retrySmsDownload()")});
-        else
-            QCOMPARE(m_fixture.bridgeCalls(), QStringList());
-        HmiPhonePopupManager::instance()->hideMessagesDownloadFailed();
-        Quorvel::StateMachine::instance()->dismissPopup(Views::PhoneSmsRetryDownloadFailed);
+        // A retry is offered by the download-failed popup only.
+        const qint64 since = ScreenFixture::mark();
+        ScreenFixture::post(Events::HmiPhoneSms_RetryMessagesDownload);
+        QCOMPARE(PhoneRootFixture::outputs(since).contains(
+                         QStringLiteral("phone.retrySmsDownload()")),
+                 now.first() == Views::PhoneSmsDownloadFailed);
+        Quorvel::StateMachine::instance()->dismissPopup(now.first());
         TestSupport::processUntilIdle();
     }
-    QCOMPARE(shown, failurePopups);
+    QCOMPARE(shown, popups);
 }
 
-// Steps: "enter" opens the message list (coming from the phone menu), "count" changes the
-// message count, "running"/"finished" start and end a download, "new" is a new message,
-// "filled" makes the empty inbox non-empty.
+// Steps: "enter" opens the list from the phone menu, "count" and "device" change the message
+// count and the phone device, "running"/"finished" a download, "new" is a new message, "filled"
+// makes the empty inbox non-empty.
 void TestTextMessages::inboxRequests_data()
 {
     QTest::addColumn<bool>("inboxEmpty");
-    QTest::addColumn<QStringList>("steps");
+    QTest::addColumn<QString>("steps");
     QTest::addColumn<int>("requests");
 
-    auto steps = [](const char *text) { return QString::fromLatin1(text).split(QLatin1Char(' ')); };
-    QTest::addRow("two entries, no change") << false << steps("enter enter") << 1;
-    QTest::addRow("a count change between entries") << false << steps("enter count enter") << 2;
-    QTest::addRow("a device change between entries") << false << steps("enter device enter") << 2;
+    QTest::addRow("two entries, no change") << false << QStringLiteral("enter") << 1;
+    QTest::addRow("count changed between entries") << false << QStringLiteral("count enter") << 2;
+    QTest::addRow("device changed between entries") << false << QStringLiteral("device enter") << 2;
     QTest::addRow("a change during a download is fetched after it")
-            << false << steps("enter running count enter finished enter enter") << 2;
-    QTest::addRow("a new message forces a request") << false << steps("enter new") << 2;
+            << false << QStringLiteral("running count enter finished enter enter") << 2;
+    QTest::addRow("a new message forces a request") << false << QStringLiteral("new") << 2;
     QTest::addRow("no forced request during a download")
-            << false << steps("enter running new") << 1;
-    QTest::addRow("an empty inbox asks nothing") << true << steps("enter enter") << 0;
-    QTest::addRow("the inbox fills while shown") << true << steps("enter filled") << 1;
+            << false << QStringLiteral("running new") << 1;
+    QTest::addRow("an empty inbox asks nothing") << true << QStringLiteral("enter") << 0;
+    QTest::addRow("the inbox fills while shown") << true << QStringLiteral("filled") << 1;
 }
 
 void TestTextMessages::inboxRequests()
 {
     QFETCH(bool, inboxEmpty);
-    QFETCH(QStringList, steps);
+    QFETCH(QString, steps);
     QFETCH(int, requests);
 
-    phone()->setMessagesInboxEmptyStatus(inboxEmpty);
-    m_fixture.build();
-    m_fixture.enter(m_fixture.phone());
-    m_fixture.mark();
-
-    int device = 1;
-    for (const QString &step : steps) {
+    Phone_Cmp *phone = openMessageList(inboxEmpty);
+    for (const QString &step : steps.split(QLatin1Char(' '))) {
         if (step == QLatin1String("enter")) {
-            m_fixture.enter(m_fixture.phone()->phoneIdleState());
-            openMessageList();
+            enter(phone->phoneIdleState());
+            enter(phone->phoneSmsCompositeState());
         } else if (step == QLatin1String("count")) {
-            phone()->setSmsTotalCount(phone()->smsTotalCount() + 1);
+            source()->setSmsTotalCount(source()->smsTotalCount() + 1);
         } else if (step == QLatin1String("device")) {
-            Mavrosk::BluetoothSource::instance()->setPhoneDevice(device++);
-        } else if (step == QLatin1String("running")) {
-            phone()->setMessagesDownloadingStatus(2);
-        } else if (step == QLatin1String("finished")) {
-            phone()->setMessagesDownloadingStatus(3);
+            Mavrosk::BluetoothSource::instance()->setPhoneDevice(7);
+        } else if (step == QLatin1String("running") || step == QLatin1String("finished")) {
+            source()->setMessagesDownloadingStatus(step == QLatin1String("running") ? 2 : 3);
         } else if (step == QLatin1String("new")) {
-            emit phone()->newTextMessageAlert();
+            emit source()->newTextMessageAlert();
         } else if (step == QLatin1String("filled")) {
-            phone()->setMessagesInboxEmptyStatus(false);
+            source()->setMessagesInboxEmptyStatus(false);
         }
         TestSupport::processUntilIdle();
     }
-    QCOMPARE(m_fixture.bridgeCalls().count(QStringLiteral("phone.requestTextMessagesInbox()")),
+    QCOMPARE(PhoneRootFixture::outputs(0).count(QStringLiteral("phone.requestTextMessagesInbox()")),
              requests);
 }
 

@@ -1,0 +1,78 @@
+#pragma once
+
+// The phone's root component built as the integration builds it, under the shared test host but
+// without the global state machine: only the phone screens' own transitions are armed.
+
+#include "screenfixture.h"
+
+#include <hmiphonecontroller.h>
+#include <hmiphoneintegration.h>
+#include <phone_cmp.h>
+
+namespace PhoneRootFixture {
+
+// Test data written as plain literals.
+inline QString operator""_q(const char *text, size_t size)
+{
+    return QString::fromUtf8(text, int(size));
+}
+
+// Writes bridge values as the phone's side would, given as "source.property=value ...".
+inline void setValues(const QString &values)
+{
+    for (const QString &value : values.split(QLatin1Char(' '), Qt::SkipEmptyParts)) {
+        const QString key = value.section(QLatin1Char('='), 0, 0);
+        for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources()) {
+            if (source->shortName() == key.section(QLatin1Char('.'), 0, 0))
+                QVERIFY2(source->setBridgeValue(key.section(QLatin1Char('.'), 1),
+                                                value.section(QLatin1Char('='), 1)),
+                         qPrintable(value));
+        }
+    }
+}
+
+// A fresh host with the data `values`, the phone built under it and the machine started.
+inline HmiPhone::Phone_Cmp *build(const QString &values = {})
+{
+    static auto *integration = new HmiPhone::HmiPhoneIntegration;
+    static auto *controller = new HmiPhone::HmiPhoneController(integration);
+    Quorvel::HmiState *parent = ScreenFixture::buildRoot();
+    setValues(values);
+    auto *phone = new HmiPhone::Phone_Cmp(integration, controller,
+                                          integration->rootStateIdentifier(), parent);
+    parent->setInitialHmiState(phone);
+    Quorvel::StateMachine::instance()->installRootHierarchy(phone->rootHierarchyTransitions(),
+                                                            phone->rootHierarchyPopups());
+    ScreenFixture::start();
+    return phone;
+}
+
+inline void enter(QAbstractState *state)
+{
+    Quorvel::StateMachine::instance()->goToState(state);
+    TestSupport::processUntilIdle();
+}
+
+// What the HMI was asked for since `since`: bridge commands (without the setters of other
+// screens), popups, back steps, posted events and intents, as "kind value".
+inline QStringList outputs(qint64 since)
+{
+    QStringList result;
+    for (const QString &command : ScreenFixture::bridgeCommandsSince(since)) {
+        if (!command.section(QLatin1Char('.'), 1).startsWith(QLatin1String("set")))
+            result.append(command);
+    }
+    const QList<QPair<QString, QString>> kinds{
+            {QStringLiteral("popup-request"), QStringLiteral("id")},
+            {QStringLiteral("back"), QStringLiteral("steps")},
+            {QStringLiteral("event"), QStringLiteral("name")},
+            {QStringLiteral("intent"), QStringLiteral("action")},
+    };
+    for (const auto &kind : kinds) {
+        for (const QString &value : TestSupport::journalValues(kind.first, kind.second, since))
+            result.append(kind.first.section(QLatin1Char('-'), 0, 0) + QLatin1Char(' ') + value);
+    }
+    return result;
+}
+
+} // namespace PhoneRootFixture
