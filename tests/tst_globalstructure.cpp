@@ -2,23 +2,14 @@
 // which level, with which auto-dismiss time. The order of the lists is what the framework sees,
 // and transitions that share a trigger are offered it in that order.
 
-#include "hmiphoneintegration.h"
+#include "globalhmi.h"
 #include "phone_cmp.h"
-#include "testsupport.h"
 
-#include <brisken/datastore.h>
-#include <brisken/viewcontroller.h>
-#include <host/modulehost.h>
-#include <mavrosk/bridge.h>
 #include <quorvel/guardedpropertychangetransition.h>
 #include <quorvel/guardedtransition.h>
 #include <quorvel/intsignaltransition.h>
 #include <quorvel/keysignaltransition.h>
 #include <quorvel/popupstate.h>
-#include <quorvel/statemachine.h>
-
-#include <QAbstractState>
-#include <memory>
 
 namespace {
 
@@ -232,36 +223,27 @@ private slots:
 
     void popupList();
     void transitionList();
-    void waitingCallEntersRinging();
 
 private:
-    std::unique_ptr<HmiPhoneModule> m_module;
-    std::unique_ptr<Host::ModuleHost> m_host;
+    std::unique_ptr<GlobalHmi> m_hmi;
     TestSupport::FrameworkWarningGuard m_guard;
 };
 
 void TestGlobalStructure::init()
 {
-    Quorvel::StateMachine::destroyInstance();
-    Mavrosk::resetAll();
-    Brisken::DataStore::reset();
-    Platform::Journal::instance()->clear();
-    m_module = std::make_unique<HmiPhoneModule>();
-    m_host = std::make_unique<Host::ModuleHost>();
-    m_host->use(m_module.get());
-    QVERIFY2(m_host->setUp(QStringLiteral("HmiPhone")), qPrintable(m_host->errorString()));
+    m_hmi = std::make_unique<GlobalHmi>();
+    QVERIFY(m_hmi->setUp());
 }
 
 void TestGlobalStructure::cleanup()
 {
-    m_host.reset();
-    m_module.reset();
+    m_hmi.reset();
     QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
 }
 
 void TestGlobalStructure::popupList()
 {
-    const auto popups = m_host->integration()->moduleRootHierarchyPopupStates();
+    const auto popups = m_hmi->host().integration()->moduleRootHierarchyPopupStates();
     const int own = int(sizeof(expectedPopups) / sizeof(expectedPopups[0]));
     QVERIFY(popups.size() >= own);
     for (int i = 0; i < own; ++i) {
@@ -278,7 +260,7 @@ void TestGlobalStructure::popupList()
     }
 
     // The root component's own popups follow, unchanged.
-    auto *phoneCmp = qobject_cast<HmiPhone::Phone_Cmp *>(m_host->moduleRoot());
+    auto *phoneCmp = qobject_cast<HmiPhone::Phone_Cmp *>(m_hmi->host().moduleRoot());
     QVERIFY(phoneCmp);
     QCOMPARE(popups.mid(own), phoneCmp->rootHierarchyPopups());
 }
@@ -293,7 +275,7 @@ void TestGlobalStructure::transitionList()
             levels.append(row.level);
         }
     }
-    const auto transitions = m_host->integration()->moduleRootHierarchyTransitions();
+    const auto transitions = m_hmi->host().integration()->moduleRootHierarchyTransitions();
     QVERIFY(transitions.size() >= expected.size());
     QStringList actual;
     QList<int> actualLevels;
@@ -304,29 +286,8 @@ void TestGlobalStructure::transitionList()
     QCOMPARE(actual, expected);
     QCOMPARE(actualLevels, levels);
 
-    auto *phoneCmp = qobject_cast<HmiPhone::Phone_Cmp *>(m_host->moduleRoot());
+    auto *phoneCmp = qobject_cast<HmiPhone::Phone_Cmp *>(m_hmi->host().moduleRoot());
     QCOMPARE(transitions.mid(expected.size()), phoneCmp->rootHierarchyTransitions());
-}
-
-void TestGlobalStructure::waitingCallEntersRinging()
-{
-    m_host->start();
-    Quorvel::PopupState *waiting = nullptr;
-    for (const auto &entry : m_host->integration()->moduleRootHierarchyPopupStates()) {
-        if (entry.second->viewId().endsWith(QLatin1String(".WaitingCall")))
-            waiting = entry.second;
-    }
-    QVERIFY(waiting);
-    QVERIFY(waiting->initialState());
-    const QString ringing = waiting->initialState()->objectName();
-
-    Brisken::ViewController::instance()->requestPopup(waiting->viewId());
-    TestSupport::processUntilIdle();
-    QStringList active;
-    for (QAbstractState *state : Quorvel::StateMachine::instance()->configuration())
-        active.append(state->objectName());
-    QVERIFY2(active.contains(waiting->objectName()), qPrintable(active.join(QLatin1Char(' '))));
-    QVERIFY(active.contains(ringing));
 }
 
 QTEST_GUILESS_MAIN(TestGlobalStructure)

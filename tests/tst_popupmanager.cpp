@@ -133,6 +133,12 @@ private slots:
         QVERIFY(first);
         QCOMPARE(HmiPhonePopupManager::instance(), first);
         QCOMPARE(first->parent(), QCoreApplication::instance());
+
+        // Once its owner has deleted it, the next caller gets a working instance again.
+        delete first;
+        HmiPhonePopupManager::instance()->showBatteryLow();
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-request")),
+                 QStringList{phoneView("BatteryLow")});
     }
 
     void slotsInTableOrder()

@@ -158,9 +158,12 @@ QString OutputWriter::details(const Output &output)
     if (kind == QLatin1String("bridge"))
         return QStringLiteral("%1(%2)").arg(field("call"),
                                             argumentList(f.value(QStringLiteral("args"))));
-    if (kind == QLatin1String("intent"))
-        return QStringLiteral("action %1 (%2)")
-                .arg(field("action"), argumentList(f.value(QStringLiteral("args"))));
+    if (kind == QLatin1String("intent")) {
+        const QVariantList args = f.value(QStringLiteral("args")).toList();
+        return args.isEmpty()
+                ? QStringLiteral("action %1").arg(field("action"))
+                : QStringLiteral("action %1 (%2)").arg(field("action"), argumentList(args));
+    }
     if (kind == QLatin1String("intent-result"))
         return QStringLiteral("action %1 -> %2")
                 .arg(field("action"), compactJson(f.value(QStringLiteral("result"))));

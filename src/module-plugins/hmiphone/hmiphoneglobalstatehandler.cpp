@@ -171,31 +171,31 @@ HmiPhoneGlobalStateHandler::HmiPhoneGlobalStateHandler(HmiPhoneController *contr
 
 // Builds the global popups and transitions once, in a fixed order: the order of creation is the
 // order in which transitions sharing a trigger are offered a notification, and the order of the
-// lists is what the framework installs.
+// lists (ListPosition) is what the framework installs. The groups in brackets belong at
+// those places, in that order.
 void HmiPhoneGlobalStateHandler::produceGlobalStateAndTransitions(Phone_Cmp *phoneCmp)
 {
     m_collectedTransitions.fill(qMakePair(Quorvel::StateLevel3, nullptr), ListPositionCount);
 
-    // 1-2: the popup states with the transitions that leave from them, then the popup list.
+    // The popup states, each with the transitions that leave from it; the root component's popups
+    // follow the global ones.
     createPopupStates();
     for (const auto &entry : phoneCmp->rootHierarchyPopups())
         m_rootHierarchyPopups.append(entry);
 
-    // 3: device and call transitions.
+    // [adding a phone, the pairing request] Calls, from ringing to end.
     createCallTransitions(phoneCmp);
-
-    // 4: key transitions.
-
-    // 5: roaming confirmation, screen and call requests, messages and sending.
-    createCallRequestTransitions();
+    // [key transitions]
+    // Roaming confirmation, status alerts and making a call [with battery, text-message requests,
+    // transfer to the handset, link loss, new messages, replying and sending in between].
+    createCallRequestTransitions(phoneCmp);
+    // [extended mode; audio, connection and contacts errors] Screens asked for from elsewhere
+    // and roaming notices.
     createScreenRequestTransitions(phoneCmp);
+    // [voice service, with the status-bar controller when there is one] The contacts request.
+    createContactsRequestTransition(phoneCmp);
+    // [dismissals of the send-message popup]
 
-    // 6: extended mode. 7: errors and connection; screen requests and roaming notices are
-    // made with the requests above. 8: voice service with the status-bar controller.
-    // 9: the level-2 contacts request is made with the screen requests. 10: dismissals of the
-    // send-message popup.
-
-    // 11: everything collected, in list order, then the root component's own entries.
     listCollectedTransitions(phoneCmp);
 }
 
@@ -231,14 +231,14 @@ void HmiPhoneGlobalStateHandler::createPopupStates()
 {
     QVector<PopupState *> popups(globalPopupCount, nullptr);
     for (int i = 0; i < globalPopupCount; ++i) {
-        const GlobalPopup &spec = globalPopups[i];
-        auto *popup = new PopupState(*spec.view, 1);
-        if (spec.autoDismissMs > 0) {
+        const GlobalPopup &row = globalPopups[i];
+        auto *popup = new PopupState(*row.view, 1);
+        if (row.autoDismissMs > 0) {
             popup->setAutoDismissTimeoutActive(true);
-            popup->setAutoDismissTimeoutInterval(spec.autoDismissMs);
+            popup->setAutoDismissTimeoutInterval(row.autoDismissMs);
         }
-        popups[spec.listPosition - 1] = popup;
-        m_popupsByView.insert(*spec.view, popup);
+        popups[row.listPosition - 1] = popup;
+        m_popupsByView.insert(*row.view, popup);
     }
     for (PopupState *popup : qAsConst(popups))
         m_rootHierarchyPopups.append(qMakePair(Quorvel::StateLevel3, popup));
@@ -457,7 +457,7 @@ void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
     list(StopAnswering, stopAnsweringRequest);
 }
 
-void HmiPhoneGlobalStateHandler::createCallRequestTransitions()
+void HmiPhoneGlobalStateHandler::createCallRequestTransitions(Phone_Cmp *phoneCmp)
 {
     auto *confirmRoaming = new HmiTransition(Events::HmiPhone_ConfirmRoamingCall, nullptr);
     connect(confirmRoaming, &QAbstractTransition::triggered, this,
@@ -467,18 +467,19 @@ void HmiPhoneGlobalStateHandler::createCallRequestTransitions()
     connect(cancelRoaming, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::roamingCallCancelled);
     list(CancelRoamingCall, cancelRoaming);
-}
 
-void HmiPhoneGlobalStateHandler::createScreenRequestTransitions(Phone_Cmp *phoneCmp)
-{
     auto *statusAlerts = new HmiTransition(Events::HmiPhone_ShowStatusBarAlertsRequest, nullptr);
     statusAlerts->setTargetState(phoneCmp->phoneStatusAlerts());
     list(ShowStatusBarAlertsRequest, statusAlerts);
 
+    // The root component dials, or asks for the roaming warning first.
     auto *makeCallRequest = new HmiTransition(Events::HmiPhone_MakeCallRequest, nullptr);
     connect(makeCallRequest, &QAbstractTransition::triggered, phoneCmp, &Phone_Cmp::makeCall);
     list(MakeCallRequest, makeCallRequest);
+}
 
+void HmiPhoneGlobalStateHandler::createScreenRequestTransitions(Phone_Cmp *phoneCmp)
+{
     auto *connectToDevice = new HmiTransition(Events::HmiPhone_ShowConnectToDevice, nullptr);
     connectToDevice->setTargetState(phoneCmp->addPhoneState());
     list(ShowConnectToDevice, connectToDevice);
@@ -495,7 +496,10 @@ void HmiPhoneGlobalStateHandler::createScreenRequestTransitions(Phone_Cmp *phone
     connect(roamingReceived, &QAbstractTransition::triggered, this,
             &HmiPhoneGlobalStateHandler::handleRoamingWarning);
     list(RoamingModeReceived, roamingReceived);
+}
 
+void HmiPhoneGlobalStateHandler::createContactsRequestTransition(Phone_Cmp *phoneCmp)
+{
     auto *contacts = new HmiTransition(Events::HmiPhone_ShowContactsRequest, nullptr);
     contacts->setTargetState(phoneCmp->phoneBookCompositeState());
     list(ShowContactsRequest, contacts, Quorvel::StateLevel2);

@@ -262,8 +262,9 @@ private:
 
     void createPopupStates();
     void createCallTransitions(Phone_Cmp *phoneCmp);
+    void createCallRequestTransitions(Phone_Cmp *phoneCmp);
     void createScreenRequestTransitions(Phone_Cmp *phoneCmp);
-    void createCallRequestTransitions();
+    void createContactsRequestTransition(Phone_Cmp *phoneCmp);
     void listCollectedTransitions(Phone_Cmp *phoneCmp);
 
     void requestTransient(const QString &name);

@@ -1,0 +1,218 @@
+// The guards of the global transitions as tables: the phone's data when a notification arrives,
+// and whether the guarded transition then fires, seen through what the HMI shows.
+
+#include "globalhmi.h"
+#include "hmiphoneglobalstatehandler.h"
+
+#include <brisken/viewmanager.h>
+#include <mavrosk/keysource.h>
+#include <mavrosk/navsource.h>
+#include <mavrosk/projectionsource.h>
+#include <quorvel/hmistate.h>
+#include <quorvel/keysignaltransition.h>
+
+#include <QSignalSpy>
+
+using namespace HmiPhone;
+
+namespace {
+
+Mavrosk::PhoneSource *phone()
+{
+    return GlobalHmi::phone();
+}
+
+void setProjection(int mode, bool rendering)
+{
+    Mavrosk::ProjectionSource::instance()->setProjectionMode(mode);
+    Mavrosk::ProjectionSource::instance()->setIsRendering(rendering);
+}
+
+QStringList popupRequestsSince(qint64 since)
+{
+    return GlobalHmi::outputsSince(since).filter(QStringLiteral("popup-request"));
+}
+
+} // namespace
+
+class TestGlobalGuards : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init() { m_hmi = std::make_unique<GlobalHmi>(); }
+    void cleanup();
+
+    void incomingCall_data();
+    void incomingCall();
+    void incomingCallAfterProjection_data();
+    void incomingCallAfterProjection();
+    void callConnected_data();
+    void callConnected();
+    void keyGuards_data();
+    void keyGuards();
+
+private:
+    std::unique_ptr<GlobalHmi> m_hmi;
+    TestSupport::FrameworkWarningGuard m_guard;
+};
+
+void TestGlobalGuards::cleanup()
+{
+    m_hmi.reset();
+    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
+}
+
+void TestGlobalGuards::incomingCall_data()
+{
+    QTest::addColumn<int>("projectionMode");
+    QTest::addColumn<bool>("rendering");
+    QTest::addColumn<bool>("doNotDisturb");
+    QTest::addColumn<bool>("popup");
+
+    QTest::addRow("no projection") << 0 << false << false << true;
+    QTest::addRow("projection 1, not rendering") << 1 << false << false << false;
+    QTest::addRow("projection 1, rendering") << 1 << true << false << true;
+    QTest::addRow("projection 2, not rendering") << 2 << false << false << true;
+    QTest::addRow("do not disturb") << 0 << false << true << false;
+}
+
+void TestGlobalGuards::incomingCall()
+{
+    QFETCH(int, projectionMode);
+    QFETCH(bool, rendering);
+    QFETCH(bool, doNotDisturb);
+    QFETCH(bool, popup);
+    setProjection(projectionMode, rendering);
+    phone()->setDoNotDisturb(doNotDisturb);
+    QVERIFY(m_hmi->run());
+
+    const qint64 since = GlobalHmi::mark();
+    phone()->setIncomingCall(true);
+    TestSupport::processUntilIdle();
+    QCOMPARE(popupRequestsSince(since).contains(QStringLiteral("popup-request IncomingCall")),
+             popup);
+}
+
+void TestGlobalGuards::incomingCallAfterProjection_data()
+{
+    QTest::addColumn<bool>("ringing");
+    QTest::addColumn<bool>("doNotDisturb");
+    QTest::addColumn<int>("projectionMode");
+    QTest::addColumn<bool>("popup");
+
+    QTest::addRow("ringing, projection gone") << true << false << 0 << true;
+    QTest::addRow("ringing, projection still on") << true << false << 1 << false;
+    QTest::addRow("not ringing") << false << false << 0 << false;
+    QTest::addRow("do not disturb") << true << true << 0 << false;
+}
+
+// A call that rang while a projection owned it comes to the HMI when the projection ends.
+void TestGlobalGuards::incomingCallAfterProjection()
+{
+    QFETCH(bool, ringing);
+    QFETCH(bool, doNotDisturb);
+    QFETCH(int, projectionMode);
+    QFETCH(bool, popup);
+    phone()->setIncomingCall(ringing);
+    phone()->setDoNotDisturb(doNotDisturb);
+    setProjection(projectionMode, false);
+    QVERIFY(m_hmi->run());
+
+    const qint64 since = GlobalHmi::mark();
+    emit Mavrosk::ProjectionSource::instance()->projectionNotActive(true);
+    TestSupport::processUntilIdle();
+    QCOMPARE(popupRequestsSince(since),
+             popup ? QStringList{QStringLiteral("popup-request IncomingCall")} : QStringList());
+}
+
+void TestGlobalGuards::callConnected_data()
+{
+    QTest::addColumn<int>("displayContext");
+    QTest::addColumn<bool>("routeActive");
+    QTest::addColumn<bool>("callConnected");
+    QTest::addColumn<bool>("dialing");
+    QTest::addColumn<bool>("callScreen");
+
+    QTest::addRow("context 0, connected") << 0 << false << true << false << true;
+    QTest::addRow("context 0, dialling") << 0 << false << false << true << true;
+    QTest::addRow("context 0, no call") << 0 << false << false << false << false;
+    QTest::addRow("context 1, connected") << 1 << false << true << false << false;
+    QTest::addRow("context 5, route active") << 5 << true << true << false << false;
+    QTest::addRow("context 5, no route") << 5 << false << true << false << true;
+    QTest::addRow("context 6, route active") << 6 << true << true << false << true;
+}
+
+void TestGlobalGuards::callConnected()
+{
+    QFETCH(int, displayContext);
+    QFETCH(bool, routeActive);
+    QFETCH(bool, callConnected);
+    QFETCH(bool, dialing);
+    QFETCH(bool, callScreen);
+    Brisken::DataStore::get<Brisken::ViewManager>(QStringLiteral("ViewManager"))
+            ->setDisplayContext(displayContext);
+    Mavrosk::NavSource::instance()->setRouteActive(routeActive);
+    QVERIFY(m_hmi->run());
+
+    phone()->setCallConnected(callConnected);
+    phone()->setDialingInProgress(dialing);
+    phone()->setStatus(callConnected ? 7 : 3);
+    TestSupport::processUntilIdle();
+    QCOMPARE(GlobalHmi::isActive(QStringLiteral("PhoneCallCmp")), callScreen);
+}
+
+void TestGlobalGuards::keyGuards_data()
+{
+    QTest::addColumn<QByteArray>("guard");
+    QTest::addColumn<int>("projectionMode");
+    QTest::addColumn<bool>("rendering");
+    QTest::addColumn<bool>("doNotDisturb");
+    QTest::addColumn<bool>("callConnected");
+    QTest::addColumn<bool>("fires");
+
+    // The phone key answering a ringing call.
+    const QByteArray ringing = SLOT(incomingCallKeySignalTransitionEventTest(QEvent *));
+    QTest::addRow("ringing") << ringing << 0 << false << false << false << true;
+    QTest::addRow("ringing during a call") << ringing << 0 << false << false << true << false;
+    QTest::addRow("ringing, projection 1") << ringing << 1 << false << false << false << false;
+    QTest::addRow("ringing, projection 1 rendering")
+            << ringing << 1 << true << false << false << true;
+    QTest::addRow("ringing, do not disturb") << ringing << 0 << false << true << false << false;
+    // The call and seek keys, which a projection keeps for itself.
+    const QByteArray seek = SLOT(isProjectionNotActive());
+    QTest::addRow("seek, no projection") << seek << 0 << true << false << false << true;
+    QTest::addRow("seek, projection 1") << seek << 1 << true << false << false << false;
+    QTest::addRow("seek, projection 2") << seek << 2 << false << false << false << false;
+}
+
+void TestGlobalGuards::keyGuards()
+{
+    QFETCH(QByteArray, guard);
+    QFETCH(int, projectionMode);
+    QFETCH(bool, rendering);
+    QFETCH(bool, doNotDisturb);
+    QFETCH(bool, callConnected);
+    QFETCH(bool, fires);
+    setProjection(projectionMode, rendering);
+    phone()->setDoNotDisturb(doNotDisturb);
+    phone()->setCallConnected(callConnected);
+    phone()->setIncomingCall(true);
+    QVERIFY(m_hmi->setUp());
+    auto *handler = m_hmi->host().integration()->findChild<HmiPhoneGlobalStateHandler *>();
+    QVERIFY(handler);
+    // A key transition of another part of the HMI, guarded by the handler's test.
+    auto *transition = new Quorvel::KeySignalTransition(
+            Mavrosk::KeySource::instance(), "2keyEvent(int, int)", 12, 2,
+            Quorvel::StateMachine::instance()->levelState(Quorvel::StateLevel1));
+    QVERIFY(connect(transition, SIGNAL(transitionTest(QEvent *)), handler, guard.constData()));
+    QSignalSpy fired(transition, &QAbstractTransition::triggered);
+    m_hmi->start();
+
+    Mavrosk::KeySource::instance()->sendKeyEvent(12, 2);
+    TestSupport::processUntilIdle();
+    QCOMPARE(fired.count(), fires ? 1 : 0);
+}
+
+QTEST_GUILESS_MAIN(TestGlobalGuards)
+#include "tst_globalguards.moc"
