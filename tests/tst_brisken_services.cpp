@@ -81,194 +81,187 @@ class TestBriskenServices : public QObject
 private slots:
     void cleanup() { DataStore::reset(); }
 
-    void viewIdentifier();
-    void dataStore();
-    void statusBar();
-    void requestObjects();
-    void actionEnabledBinding();
-    void moduleControllerPostsLater_data();
-    void moduleControllerPostsLater();
-    void makeExclusiveClosesPopups();
-};
-
-void TestBriskenServices::viewIdentifier()
-{
-    QCOMPARE(loadTimeIdentifier, QStringLiteral("PHONE.PhoneMenu"));
-    QCOMPARE(ViewManager::viewIdentifier(QStringLiteral("PHONE"), QStringLiteral("PhoneMenu")),
-             loadTimeIdentifier);
-}
-
-void TestBriskenServices::dataStore()
-{
-    auto *viewManager = DataStore::get<ViewManager>(QStringLiteral("ViewManager"));
-    QVERIFY(viewManager);
-    QVERIFY(sharedStatusBar());
-    QVERIFY(!DataStore::get(QStringLiteral("NoSuchService")));
-
-    QSignalSpy contextSpy(viewManager, &ViewManager::displayContextChanged);
-    viewManager->setDisplayContext(5);
-    viewManager->setDisplayContext(5);
-    QCOMPARE(viewManager->displayContext(), 5);
-    QCOMPARE(contextSpy.size(), 1);
-
-    DataStore::remove(QStringLiteral("StatusBarController"));
-    QVERIFY(!sharedStatusBar());
+    void viewIdentifier()
     {
-        StatusBarController hostStatusBar;
-        DataStore::set(QStringLiteral("StatusBarController"), &hostStatusBar);
-        QCOMPARE(sharedStatusBar(), &hostStatusBar);
+        QCOMPARE(loadTimeIdentifier, QStringLiteral("PHONE.PhoneMenu"));
+        QCOMPARE(ViewManager::viewIdentifier(QStringLiteral("PHONE"), QStringLiteral("PhoneMenu")),
+                 loadTimeIdentifier);
     }
-    // The store does not keep an object the host destroyed.
-    QVERIFY(!sharedStatusBar());
 
-    DataStore::reset();
-    QCOMPARE(DataStore::get<ViewManager>(QStringLiteral("ViewManager")), viewManager);
-    QCOMPARE(viewManager->displayContext(), 0);
-    QVERIFY(sharedStatusBar());
-}
+    void dataStore()
+    {
+        auto *viewManager = DataStore::get<ViewManager>(QStringLiteral("ViewManager"));
+        QVERIFY(viewManager);
+        QVERIFY(sharedStatusBar());
+        QVERIFY(!DataStore::get(QStringLiteral("NoSuchService")));
 
-void TestBriskenServices::statusBar()
-{
-    StatusBarController *bar = sharedStatusBar();
-    QSignalSpy visibleSpy(bar, &StatusBarController::statusBarVisibleChanged);
-    QVERIFY(bar->statusBarVisible());
-    bar->setStatusBarVisible(true);
-    bar->setStatusBarVisible(false);
-    QCOMPARE(visibleSpy.size(), 1);
-    QCOMPARE(visibleSpy.first().first().toBool(), false);
+        QSignalSpy contextSpy(viewManager, &ViewManager::displayContextChanged);
+        viewManager->setDisplayContext(5);
+        viewManager->setDisplayContext(5);
+        QCOMPARE(viewManager->displayContext(), 5);
+        QCOMPARE(contextSpy.size(), 1);
 
-    const qint64 since = Journal::instance()->lastSequence();
-    bar->requestTransientWidget(QStringLiteral("First"), 0);
-    bar->requestTransientWidget(QStringLiteral("Second"), 3);
-    bar->hideTransientWidget(QStringLiteral("First"));
-    QCOMPARE(TestSupport::journalLines(since),
-             (QStringList{QStringLiteral("transient First"), QStringLiteral("transient Second"),
-                          QStringLiteral("transient-hide First")}));
-    QCOMPARE(
-            TestSupport::journalValues(QStringLiteral("transient"), QStringLiteral("value"), since),
-            (QStringList{QStringLiteral("0"), QStringLiteral("3")}));
-    QCOMPARE(bar->transientWidgets(), QStringList{QStringLiteral("Second")});
-}
+        DataStore::remove(QStringLiteral("StatusBarController"));
+        QVERIFY(!sharedStatusBar());
+        {
+            StatusBarController hostStatusBar;
+            DataStore::set(QStringLiteral("StatusBarController"), &hostStatusBar);
+            QCOMPARE(sharedStatusBar(), &hostStatusBar);
+        }
+        // The store does not keep an object the host destroyed.
+        QVERIFY(!sharedStatusBar());
 
-// Built once, each request object runs each time its signal fires, in the order connected.
-void TestBriskenServices::requestObjects()
-{
-    Machine machine;
-    machine.start();
-    StatusBarController *bar = sharedStatusBar();
-    StatusBarController hiddenBar;
-    hiddenBar.setStatusBarVisible(false);
-    QObject siri;
-    siri.setProperty("siriActive", true);
-    const QString note = QStringLiteral("Note");
-    const QString popup = QStringLiteral("T.Second");
-    QObject trigger;
-    auto add = [&trigger](auto request) {
-        QObject::connect(&trigger, &QObject::objectNameChanged, request);
-    };
-    add(Brisken::RequestPopup(machine.first, QVariant()));
-    add(Brisken::DismissPopup(QStringLiteral("T.First")));
-    add(Brisken::RequestView(Quorvel::NamedState::stateForName(QStringLiteral("Home"))));
-    add(Brisken::ShowTransientOrPopupRequest(bar, note, popup));
-    add(Brisken::ShowTransientOrPopupRequest(&hiddenBar, note, popup));
-    add(Brisken::ShowTransientOrPopupRequest(nullptr, note, popup));
-    add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
-                                                        true));
-    add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
-                                                        false));
-    add(Brisken::HideTransientRequest(bar, note));
-    const qint64 since = TestSupport::mark();
+        DataStore::reset();
+        QCOMPARE(DataStore::get<ViewManager>(QStringLiteral("ViewManager")), viewManager);
+        QCOMPARE(viewManager->displayContext(), 0);
+        QVERIFY(sharedStatusBar());
+    }
 
-    trigger.setObjectName(QStringLiteral("once"));
-    trigger.setObjectName(QStringLiteral("twice"));
+    void statusBar()
+    {
+        StatusBarController *bar = sharedStatusBar();
+        QSignalSpy visibleSpy(bar, &StatusBarController::statusBarVisibleChanged);
+        QVERIFY(bar->statusBarVisible());
+        bar->setStatusBarVisible(true);
+        bar->setStatusBarVisible(false);
+        QCOMPARE(visibleSpy.size(), 1);
+        QCOMPARE(visibleSpy.first().first().toBool(), false);
 
-    const QStringList once{
-            QStringLiteral("popup-request T.First"),  QStringLiteral("popup-dismiss T.First"),
-            QStringLiteral("view-request Home"),      QStringLiteral("transient Note"),
-            QStringLiteral("popup-request T.Second"), QStringLiteral("popup-request T.Second"),
-            QStringLiteral("transient Note"),         QStringLiteral("transient-hide Note")};
-    QCOMPARE(TestSupport::journalLines(since,
-                                       {QStringLiteral("popup-request"),
-                                        QStringLiteral("popup-dismiss"),
-                                        QStringLiteral("view-request"), QStringLiteral("transient"),
-                                        QStringLiteral("transient-hide")}),
-             once + once);
-}
+        const qint64 since = Journal::instance()->lastSequence();
+        bar->requestTransientWidget(QStringLiteral("First"), 0);
+        bar->requestTransientWidget(QStringLiteral("Second"), 3);
+        bar->hideTransientWidget(QStringLiteral("First"));
+        QCOMPARE(TestSupport::journalLines(since),
+                 (QStringList{QStringLiteral("transient First"), QStringLiteral("transient Second"),
+                              QStringLiteral("transient-hide First")}));
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("transient"), QStringLiteral("value"),
+                                            since),
+                 (QStringList{QStringLiteral("0"), QStringLiteral("3")}));
+        QCOMPARE(bar->transientWidgets(), QStringList{QStringLiteral("Second")});
+    }
 
-void TestBriskenServices::actionEnabledBinding()
-{
-    Brisken::HmiAction action(hmiActionNameTr("Phone"), QStringLiteral("settings/icon_phone"), 3);
-    action.setTranslationContext(QStringLiteral("Some::Context"));
-    QCOMPARE(action.text(), QStringLiteral("Phone"));
-    StatusBarController sender;
-    QVERIFY(action.enabledBinding(&sender, SIGNAL(statusBarVisibleChanged(bool))));
-    QSignalSpy triggered(&action, &Brisken::HmiAction::triggered);
-
-    emit sender.statusBarVisibleChanged(false);
-    action.trigger();
-    QVERIFY(!action.isEnabled());
-    emit sender.statusBarVisibleChanged(true);
-    action.trigger();
-    QVERIFY(action.isEnabled());
-    QCOMPARE(triggered.size(), 1);
-
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("No such signal")));
-    QTest::ignoreMessage(QtCriticalMsg, QRegularExpression(QStringLiteral("cannot bind")));
-    QVERIFY(!action.enabledBinding(&sender, SIGNAL(noSuchSignal(bool))));
-}
-
-void TestBriskenServices::moduleControllerPostsLater_data()
-{
-    QTest::addColumn<bool>("startFirst");
-    QTest::addRow("running machine") << true;
-    QTest::addRow("posted before the machine starts") << false;
-}
-
-void TestBriskenServices::moduleControllerPostsLater()
-{
-    QFETCH(bool, startFirst);
-    Machine machine;
-    if (startFirst)
+    // Built once, each request object runs each time its signal fires, in the order connected.
+    void requestObjects()
+    {
+        Machine machine;
         machine.start();
-    Brisken::ModuleController controller;
-    const qint64 since = Journal::instance()->lastSequence();
+        StatusBarController *bar = sharedStatusBar();
+        StatusBarController hiddenBar;
+        hiddenBar.setStatusBarVisible(false);
+        QObject siri;
+        siri.setProperty("siriActive", true);
+        const QString note = QStringLiteral("Note");
+        const QString popup = QStringLiteral("T.Second");
+        QObject trigger;
+        auto add = [&trigger](auto request) {
+            QObject::connect(&trigger, &QObject::objectNameChanged, request);
+        };
+        add(Brisken::RequestPopup(machine.first, QVariant()));
+        add(Brisken::DismissPopup(QStringLiteral("T.First")));
+        add(Brisken::RequestView(Quorvel::NamedState::stateForName(QStringLiteral("Home"))));
+        add(Brisken::ShowTransientOrPopupRequest(bar, note, popup));
+        add(Brisken::ShowTransientOrPopupRequest(&hiddenBar, note, popup));
+        add(Brisken::ShowTransientOrPopupRequest(nullptr, note, popup));
+        add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
+                                                            true));
+        add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
+                                                            false));
+        add(Brisken::HideTransientRequest(bar, note));
+        const qint64 since = TestSupport::mark();
 
-    controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 42));
-    controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("fire")));
+        trigger.setObjectName(QStringLiteral("once"));
+        trigger.setObjectName(QStringLiteral("twice"));
 
-    QCOMPARE(machine.fired, 0);
-    QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), since),
-             (QStringList{QStringLiteral("Fire"), QStringLiteral("fire")}));
-    QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("value"), since)
-                     .first(),
-             QStringLiteral("42"));
-    if (!startFirst)
+        const QStringList once{
+                QStringLiteral("popup-request T.First"),  QStringLiteral("popup-dismiss T.First"),
+                QStringLiteral("view-request Home"),      QStringLiteral("transient Note"),
+                QStringLiteral("popup-request T.Second"), QStringLiteral("popup-request T.Second"),
+                QStringLiteral("transient Note"),         QStringLiteral("transient-hide Note")};
+        QCOMPARE(TestSupport::journalLines(
+                         since,
+                         {QStringLiteral("popup-request"), QStringLiteral("popup-dismiss"),
+                          QStringLiteral("view-request"), QStringLiteral("transient"),
+                          QStringLiteral("transient-hide")}),
+                 once + once);
+    }
+
+    void actionEnabledBinding()
+    {
+        Brisken::HmiAction action(hmiActionNameTr("Phone"), QStringLiteral("settings/icon_phone"),
+                                  3);
+        action.setTranslationContext(QStringLiteral("Some::Context"));
+        QCOMPARE(action.text(), QStringLiteral("Phone"));
+        StatusBarController sender;
+        QVERIFY(action.enabledBinding(&sender, SIGNAL(statusBarVisibleChanged(bool))));
+        QSignalSpy triggered(&action, &Brisken::HmiAction::triggered);
+
+        emit sender.statusBarVisibleChanged(false);
+        action.trigger();
+        QVERIFY(!action.isEnabled());
+        emit sender.statusBarVisibleChanged(true);
+        action.trigger();
+        QVERIFY(action.isEnabled());
+        QCOMPARE(triggered.size(), 1);
+
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("No such signal")));
+        QTest::ignoreMessage(QtCriticalMsg, QRegularExpression(QStringLiteral("cannot bind")));
+        QVERIFY(!action.enabledBinding(&sender, SIGNAL(noSuchSignal(bool))));
+    }
+
+    void moduleControllerPostsLater_data()
+    {
+        QTest::addColumn<bool>("startFirst");
+        QTest::addRow("running machine") << true;
+        QTest::addRow("posted before the machine starts") << false;
+    }
+
+    void moduleControllerPostsLater()
+    {
+        QFETCH(bool, startFirst);
+        Machine machine;
+        if (startFirst)
+            machine.start();
+        Brisken::ModuleController controller;
+        const qint64 since = Journal::instance()->lastSequence();
+
+        controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 42));
+        controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("fire")));
+
+        QCOMPARE(machine.fired, 0);
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), since),
+                 (QStringList{QStringLiteral("Fire"), QStringLiteral("fire")}));
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("value"), since)
+                         .first(),
+                 QStringLiteral("42"));
+        if (!startFirst)
+            machine.start();
+        TestSupport::processUntilIdle();
+        QCOMPARE(machine.fired, 1);
+        QCOMPARE(machine.fire->transitionData(), QVariant(42));
+    }
+
+    void makeExclusiveClosesPopups()
+    {
+        Machine machine;
         machine.start();
-    TestSupport::processUntilIdle();
-    QCOMPARE(machine.fired, 1);
-    QCOMPARE(machine.fire->transitionData(), QVariant(42));
-}
+        auto *other = new Quorvel::HmiTransition(QStringLiteral("Other"));
+        machine.machine->installRootHierarchy({{Quorvel::StateLevel3, other}}, {});
+        Brisken::PopupUtils::makeExclusive(machine.fire,
+                                           QList<Quorvel::PopupState *>{machine.first});
+        Brisken::PopupUtils::makeExclusive(other, {machine.second});
+        Brisken::ViewController *views = Brisken::ViewController::instance();
+        views->requestPopup(QStringLiteral("T.First"));
+        views->requestPopup(QStringLiteral("T.Second"));
+        TestSupport::processUntilIdle();
 
-void TestBriskenServices::makeExclusiveClosesPopups()
-{
-    Machine machine;
-    machine.start();
-    auto *other = new Quorvel::HmiTransition(QStringLiteral("Other"));
-    machine.machine->installRootHierarchy({{Quorvel::StateLevel3, other}}, {});
-    Brisken::PopupUtils::makeExclusive(machine.fire, QList<Quorvel::PopupState *>{machine.first});
-    Brisken::PopupUtils::makeExclusive(other, {machine.second});
-    Brisken::ViewController *views = Brisken::ViewController::instance();
-    views->requestPopup(QStringLiteral("T.First"));
-    views->requestPopup(QStringLiteral("T.Second"));
-    TestSupport::processUntilIdle();
+        machine.machine->postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire")));
+        TestSupport::processUntilIdle();
 
-    machine.machine->postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire")));
-    TestSupport::processUntilIdle();
-
-    QCOMPARE(views->shownPopups(), QStringList{QStringLiteral("T.Second")});
-    QCOMPARE(machine.machine->popupStack(QStringLiteral("T.First")),
-             QStringList{QStringLiteral("T.Second")});
-}
+        QCOMPARE(views->shownPopups(), QStringList{QStringLiteral("T.Second")});
+        QCOMPARE(machine.machine->popupStack(QStringLiteral("T.First")),
+                 QStringList{QStringLiteral("T.Second")});
+    }
+};
 
 QTEST_GUILESS_MAIN(TestBriskenServices)
 #include "tst_brisken_services.moc"

@@ -71,60 +71,30 @@ class TestController : public QObject
     Q_OBJECT
 
 private slots:
-    void init();
-    void cleanup();
+    void init()
+    {
+        for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources())
+            source->reset();
+        QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
+        m_controller = std::make_unique<HmiPhoneController>(nullptr);
+        m_since = Platform::Journal::instance()->lastSequence();
+    }
 
-    void eventRequests_data();
-    void eventRequests();
-    void platformRequests_data();
-    void platformRequests();
-    void jumpToPhoneSection_data();
-    void jumpToPhoneSection();
-    void emptyToneIsRefused();
+    void cleanup()
+    {
+        m_controller.reset();
+        TestSupport::processUntilIdle();
+        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
+    }
 
-    void numberFlags_data();
-    void numberFlags();
-    void batteryWarning_data();
-    void batteryWarning();
-    void setters_data();
-    void setters();
-    void receivedTextMessageCount();
+    void eventRequests_data()
+    {
+        QTest::addColumn<Request>("request");
+        QTest::addColumn<QString>("name");
+        QTest::addColumn<QVariant>("value");
 
-    void windowForVisibleRows_data();
-    void windowForVisibleRows();
-    void windowForLetter_data();
-    void windowForLetter();
-
-private:
-    TestSupport::FrameworkWarningGuard m_guard;
-    std::unique_ptr<HmiPhoneController> m_controller;
-    qint64 m_since = 0;
-};
-
-void TestController::init()
-{
-    for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources())
-        source->reset();
-    QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
-    m_controller = std::make_unique<HmiPhoneController>(nullptr);
-    m_since = Platform::Journal::instance()->lastSequence();
-}
-
-void TestController::cleanup()
-{
-    m_controller.reset();
-    TestSupport::processUntilIdle();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-}
-
-void TestController::eventRequests_data()
-{
-    QTest::addColumn<Request>("request");
-    QTest::addColumn<QString>("name");
-    QTest::addColumn<QVariant>("value");
-
-    const QVariant none;
-    // clang-format off
+        const QVariant none;
+        // clang-format off
     const QList<std::tuple<const char *, Request, const char *, QVariant>> rows {
         { "viewRecentCalls", [](HmiPhoneController &c) { c.viewRecentCalls(); }, "HmiPhone_ShowRecentCallsRequest", none },
         { "viewContacts", [](HmiPhoneController &c) { c.viewContacts(); }, "HmiPhone_ShowContactsRequest", none },
@@ -207,33 +177,33 @@ void TestController::eventRequests_data()
         { "requestPhoneTextMessageNotificationSettingsPage", [](HmiPhoneController &c) { c.requestPhoneTextMessageNotificationSettingsPage(); }, "HmiPhone_requestPhoneTextMessageNotificationSettingsPage", none },
         { "requestPhoneDeleteAllContactsPopup", [](HmiPhoneController &c) { c.requestPhoneDeleteAllContactsPopup(); }, "HmiPhone_RequestPhoneDeleteAllContactsPopup", none },
     };
-    // clang-format on
-    for (const auto &[tag, request, name, value] : rows)
-        QTest::newRow(tag) << request << QString::fromLatin1(name) << value;
-}
+        // clang-format on
+        for (const auto &[tag, request, name, value] : rows)
+            QTest::newRow(tag) << request << QString::fromLatin1(name) << value;
+    }
 
-void TestController::eventRequests()
-{
-    QFETCH(Request, request);
-    QFETCH(QString, name);
-    QFETCH(QVariant, value);
+    void eventRequests()
+    {
+        QFETCH(Request, request);
+        QFETCH(QString, name);
+        QFETCH(QVariant, value);
 
-    request(*m_controller);
+        request(*m_controller);
 
-    // Exactly one posted event, and nothing else asked of the platform.
-    QCOMPARE(trace(m_since), QStringList{QStringLiteral("event ") + name});
-    const QVariant postedValue
-            = Platform::Journal::instance()->entries().last().fields.value(QStringLiteral("value"));
-    QCOMPARE(postedValue.userType(), value.userType());
-    QCOMPARE(postedValue, value);
-}
+        // Exactly one posted event, and nothing else asked of the platform.
+        QCOMPARE(trace(m_since), QStringList{QStringLiteral("event ") + name});
+        const QVariant postedValue = Platform::Journal::instance()->entries().last().fields.value(
+                QStringLiteral("value"));
+        QCOMPARE(postedValue.userType(), value.userType());
+        QCOMPARE(postedValue, value);
+    }
 
-void TestController::platformRequests_data()
-{
-    QTest::addColumn<Request>("request");
-    QTest::addColumn<QStringList>("expected");
+    void platformRequests_data()
+    {
+        QTest::addColumn<Request>("request");
+        QTest::addColumn<QStringList>("expected");
 
-    // clang-format off
+        // clang-format off
     QTest::newRow("addPhonePressed") << Request([](HmiPhoneController &c) { c.addPhonePressed(); }) << expect({ "intent 28()" });
     QTest::newRow("gotoPhoneSettings") << Request([](HmiPhoneController &c) { c.gotoPhoneSettings(); }) << expect({ "intent 7()" });
     QTest::newRow("viewBluetoothDevices") << Request([](HmiPhoneController &c) { c.viewBluetoothDevices(); }) << expect({ "intent 15()" });
@@ -291,263 +261,273 @@ void TestController::platformRequests_data()
                                                                   "phone.setOutboundRoamingCallIsFromRecentList(true)", "event HmiPhone_RoamingMode" });
     QTest::newRow("recent call, no prompt") << Request([](HmiPhoneController &c) { setRoaming(true, true, false); c.dialRecentCall(2, 5); })
                                             << expect({ "phone.dialRecentCall(2,5)" });
-    // clang-format on
-}
+        // clang-format on
+    }
 
-void TestController::platformRequests()
-{
-    QFETCH(Request, request);
-    QFETCH(QStringList, expected);
-    Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("phoneDevice"), 3);
+    void platformRequests()
+    {
+        QFETCH(Request, request);
+        QFETCH(QStringList, expected);
+        Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("phoneDevice"), 3);
 
-    request(*m_controller);
+        request(*m_controller);
 
-    QCOMPARE(trace(m_since), expected);
-}
+        QCOMPARE(trace(m_since), expected);
+    }
 
-void TestController::jumpToPhoneSection_data()
-{
-    QTest::addColumn<bool>("withIntegration");
-    QTest::addColumn<bool>("withViewController");
+    void jumpToPhoneSection_data()
+    {
+        QTest::addColumn<bool>("withIntegration");
+        QTest::addColumn<bool>("withViewController");
 
-    QTest::newRow("integration and view controller") << true << true;
-    QTest::newRow("no view controller") << true << false;
-    QTest::newRow("no integration") << false << true;
-}
+        QTest::newRow("integration and view controller") << true << true;
+        QTest::newRow("no view controller") << true << false;
+        QTest::newRow("no integration") << false << true;
+    }
 
-void TestController::jumpToPhoneSection()
-{
-    QFETCH(bool, withIntegration);
-    QFETCH(bool, withViewController);
-    HmiPhone::HmiPhoneIntegration integration;
-    HmiPhoneController *controller
-            = withIntegration ? integration.findChild<HmiPhoneController *>() : m_controller.get();
-    QVERIFY(controller);
-    if (!withViewController)
-        controller->setViewController(nullptr);
-    m_since = Platform::Journal::instance()->lastSequence();
+    void jumpToPhoneSection()
+    {
+        QFETCH(bool, withIntegration);
+        QFETCH(bool, withViewController);
+        HmiPhone::HmiPhoneIntegration integration;
+        HmiPhoneController *controller = withIntegration
+                ? integration.findChild<HmiPhoneController *>()
+                : m_controller.get();
+        QVERIFY(controller);
+        if (!withViewController)
+            controller->setViewController(nullptr);
+        m_since = Platform::Journal::instance()->lastSequence();
 
-    controller->jumpToPhoneSection();
+        controller->jumpToPhoneSection();
 
-    const QStringList expected = withIntegration && withViewController
-            ? QStringList{integration.rootStateIdentifier()}
-            : QStringList();
-    QCOMPARE(TestSupport::journalValues(QStringLiteral("view-request"), QStringLiteral("id"),
-                                        m_since),
-             expected);
-}
+        const QStringList expected = withIntegration && withViewController
+                ? QStringList{integration.rootStateIdentifier()}
+                : QStringList();
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("view-request"), QStringLiteral("id"),
+                                            m_since),
+                 expected);
+    }
 
-void TestController::emptyToneIsRefused()
-{
-    QTest::ignoreMessage(QtCriticalMsg,
-                         "Hmi Phone Controller: tone string empty, cannot extract tone char");
-    m_controller->dialPadTonePressed(QString(), QStringLiteral("1"));
-    QVERIFY(trace(m_since).isEmpty());
-}
+    void emptyToneIsRefused()
+    {
+        QTest::ignoreMessage(QtCriticalMsg,
+                             "Hmi Phone Controller: tone string empty, cannot extract tone char");
+        m_controller->dialPadTonePressed(QString(), QStringLiteral("1"));
+        QVERIFY(trace(m_since).isEmpty());
+    }
 
-void TestController::numberFlags_data()
-{
-    QTest::addColumn<QStringList>("numbers"); // entered numbers in turn; the last is checked
-    QTest::addColumn<int>("fullChanges");
-    QTest::addColumn<int>("emptyChanges");
-    QTest::addColumn<bool>("full");
-    QTest::addColumn<bool>("empty");
+    void numberFlags_data()
+    {
+        QTest::addColumn<QStringList>("numbers"); // entered numbers in turn; the last is checked
+        QTest::addColumn<int>("fullChanges");
+        QTest::addColumn<int>("emptyChanges");
+        QTest::addColumn<bool>("full");
+        QTest::addColumn<bool>("empty");
 
-    const QString full = QString(22, QLatin1Char('1'));
-    QTest::newRow("nothing entered yet") << QStringList() << 0 << 0 << false << true;
-    QTest::newRow("empty to one digit")
-            << QStringList{QStringLiteral("1")} << 0 << 1 << false << false;
-    QTest::newRow("one digit to two")
-            << QStringList{QStringLiteral("1"), QStringLiteral("12")} << 0 << 1 << false << false;
-    QTest::newRow("22 characters are full") << QStringList{full} << 1 << 1 << true << false;
-    QTest::newRow("23 characters are not")
-            << QStringList{full, full + QLatin1Char('1')} << 2 << 1 << false << false;
-    QTest::newRow("cleared again")
-            << QStringList{QStringLiteral("1"), QString()} << 0 << 2 << false << true;
-}
+        const QString full = QString(22, QLatin1Char('1'));
+        QTest::newRow("nothing entered yet") << QStringList() << 0 << 0 << false << true;
+        QTest::newRow("empty to one digit")
+                << QStringList{QStringLiteral("1")} << 0 << 1 << false << false;
+        QTest::newRow("one digit to two") << QStringList{QStringLiteral("1"), QStringLiteral("12")}
+                                          << 0 << 1 << false << false;
+        QTest::newRow("22 characters are full") << QStringList{full} << 1 << 1 << true << false;
+        QTest::newRow("23 characters are not")
+                << QStringList{full, full + QLatin1Char('1')} << 2 << 1 << false << false;
+        QTest::newRow("cleared again")
+                << QStringList{QStringLiteral("1"), QString()} << 0 << 2 << false << true;
+    }
 
-void TestController::numberFlags()
-{
-    QFETCH(QStringList, numbers);
-    QFETCH(int, fullChanges);
-    QFETCH(int, emptyChanges);
-    QFETCH(bool, full);
-    QFETCH(bool, empty);
+    void numberFlags()
+    {
+        QFETCH(QStringList, numbers);
+        QFETCH(int, fullChanges);
+        QFETCH(int, emptyChanges);
+        QFETCH(bool, full);
+        QFETCH(bool, empty);
 
-    // A number the phone held before the controller existed does not count.
-    Mavrosk::PhoneSource *phone = Mavrosk::PhoneSource::instance();
-    phone->setBridgeValue(QStringLiteral("callNumberEntered"), QStringLiteral("999"));
-    m_controller.reset();
-    QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
-    m_controller = std::make_unique<HmiPhoneController>(nullptr);
-    QCOMPARE(m_controller->property("isEmptyNumber").toBool(), true);
-    phone->setBridgeValue(QStringLiteral("callNumberEntered"), QString());
+        // A number the phone held before the controller existed does not count.
+        Mavrosk::PhoneSource *phone = Mavrosk::PhoneSource::instance();
+        phone->setBridgeValue(QStringLiteral("callNumberEntered"), QStringLiteral("999"));
+        m_controller.reset();
+        QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
+        m_controller = std::make_unique<HmiPhoneController>(nullptr);
+        QCOMPARE(m_controller->property("isEmptyNumber").toBool(), true);
+        phone->setBridgeValue(QStringLiteral("callNumberEntered"), QString());
 
-    QSignalSpy fullSpy(m_controller.get(), &HmiPhoneController::isMaximumSizeOfNumberChanged);
-    QSignalSpy emptySpy(m_controller.get(), &HmiPhoneController::isEmptyNumberChanged);
-    for (const QString &number : numbers)
-        phone->setBridgeValue(QStringLiteral("callNumberEntered"), number);
+        QSignalSpy fullSpy(m_controller.get(), &HmiPhoneController::isMaximumSizeOfNumberChanged);
+        QSignalSpy emptySpy(m_controller.get(), &HmiPhoneController::isEmptyNumberChanged);
+        for (const QString &number : numbers)
+            phone->setBridgeValue(QStringLiteral("callNumberEntered"), number);
 
-    QCOMPARE(fullSpy.count(), fullChanges);
-    QCOMPARE(emptySpy.count(), emptyChanges);
-    QCOMPARE(m_controller->property("isMaximumSizeOfNumber").toBool(), full);
-    QCOMPARE(m_controller->property("isEmptyNumber").toBool(), empty);
-}
+        QCOMPARE(fullSpy.count(), fullChanges);
+        QCOMPARE(emptySpy.count(), emptyChanges);
+        QCOMPARE(m_controller->property("isMaximumSizeOfNumber").toBool(), full);
+        QCOMPARE(m_controller->property("isEmptyNumber").toBool(), empty);
+    }
 
-void TestController::batteryWarning_data()
-{
-    QTest::addColumn<QList<int>>("levels"); // -100 stands for "the phone device changed"
-    QTest::addColumn<QList<bool>>("answers");
+    void batteryWarning_data()
+    {
+        QTest::addColumn<QList<int>>("levels"); // -100 stands for "the phone device changed"
+        QTest::addColumn<QList<bool>>("answers");
 
-    QTest::newRow("enter, stay, leave, re-enter")
-            << QList<int>{3, 1, 1, 0, 2, 1} << QList<bool>{false, true, false, false, false, true};
-    QTest::newRow("first reading already low") << QList<int>{1} << QList<bool>{true};
-    QTest::newRow("unknown level re-arms")
-            << QList<int>{1, -1, 0} << QList<bool>{true, false, true};
-    QTest::newRow("new phone warns again")
-            << QList<int>{0, -100, 0} << QList<bool>{true, false, true};
-}
+        QTest::newRow("enter, stay, leave, re-enter")
+                << QList<int>{3, 1, 1, 0, 2, 1}
+                << QList<bool>{false, true, false, false, false, true};
+        QTest::newRow("first reading already low") << QList<int>{1} << QList<bool>{true};
+        QTest::newRow("unknown level re-arms")
+                << QList<int>{1, -1, 0} << QList<bool>{true, false, true};
+        QTest::newRow("new phone warns again")
+                << QList<int>{0, -100, 0} << QList<bool>{true, false, true};
+    }
 
-void TestController::batteryWarning()
-{
-    QFETCH(QList<int>, levels);
-    QFETCH(QList<bool>, answers);
+    void batteryWarning()
+    {
+        QFETCH(QList<int>, levels);
+        QFETCH(QList<bool>, answers);
 
-    QList<bool> actual;
-    for (int level : levels) {
-        if (level == -100) {
-            Mavrosk::BluetoothSource *bluetooth = Mavrosk::BluetoothSource::instance();
-            bluetooth->setBridgeValue(QStringLiteral("phoneDevice"), bluetooth->phoneDevice() + 1);
-            actual << false;
-            continue;
+        QList<bool> actual;
+        for (int level : levels) {
+            if (level == -100) {
+                Mavrosk::BluetoothSource *bluetooth = Mavrosk::BluetoothSource::instance();
+                bluetooth->setBridgeValue(QStringLiteral("phoneDevice"),
+                                          bluetooth->phoneDevice() + 1);
+                actual << false;
+                continue;
+            }
+            actual << m_controller->shouldBatteryWarningBeShown(level);
         }
-        actual << m_controller->shouldBatteryWarningBeShown(level);
-    }
-    QCOMPARE(actual, answers);
-}
-
-void TestController::setters_data()
-{
-    QTest::addColumn<QByteArray>("property");
-    QTest::addColumn<int>("value");
-    QTest::addColumn<int>("stored");
-
-    QTest::newRow("long press negative is clamped") << QByteArray("longPressInterval") << -5 << 0;
-    QTest::newRow("long press") << QByteArray("longPressInterval") << 1500 << 1500;
-    QTest::newRow("battery low level") << QByteArray("batteryLowLevel") << 2 << 2;
-}
-
-void TestController::setters()
-{
-    QFETCH(QByteArray, property);
-    QFETCH(int, value);
-    QFETCH(int, stored);
-
-    const QMetaProperty meta = m_controller->metaObject()->property(
-            m_controller->metaObject()->indexOfProperty(property));
-    QSignalSpy spy(m_controller.get(), meta.notifySignal());
-
-    // The announced value is the stored one, and the same request twice is one change.
-    QVERIFY(m_controller->setProperty(property, value));
-    QVERIFY(m_controller->setProperty(property, value));
-    QCOMPARE(m_controller->property(property).toInt(), stored);
-    QCOMPARE(spy.count(), 1);
-    QCOMPARE(spy.first().first().toInt(), stored);
-}
-
-void TestController::receivedTextMessageCount()
-{
-    QSignalSpy spy(m_controller.get(), &HmiPhoneController::receivedTextMessageCountChanged);
-    m_controller->resetRecievedTextMessageCount();
-    QCOMPARE(spy.count(), 0);
-    m_controller->incrementRecievedTextMessageCount();
-    m_controller->incrementRecievedTextMessageCount();
-    m_controller->resetRecievedTextMessageCount();
-    QCOMPARE(spy.count(), 3);
-    QCOMPARE(spy.at(1).first().toInt(), 2);
-    QCOMPARE(spy.at(2).first().toInt(), 0);
-}
-
-void TestController::windowForVisibleRows_data()
-{
-    QTest::addColumn<int>("top");
-    QTest::addColumn<int>("bottom");
-    QTest::addColumn<int>("perPage");
-    QTest::addColumn<int>("listLength");
-    QTest::addColumn<int>("minRow");
-    QTest::addColumn<int>("maxRow");
-
-    QTest::newRow("whole C section") << 12 << 15 << 4 << 60 << 10 << 24;
-    QTest::newRow("top of the list") << 0 << 3 << 4 << 60 << 0 << 9;
-    QTest::newRow("E section to the end") << 45 << 48 << 4 << 60 << 40 << 59;
-    QTest::newRow("five rows limit") << 12 << 15 << 1 << 60 << 10 << 14;
-    QTest::newRow("bottom row equals letter count") << 0 << 4 << 4 << 60 << 0 << 9;
-    QTest::newRow("top row below, bottom equals count") << 2 << 4 << 4 << 60 << 0 << 9;
-    QTest::newRow("whole short list on screen") << 0 << 29 << 10 << 30 << 0 << 29;
-    QTest::newRow("whole list, five pages at most") << 0 << 59 << 4 << 60 << 0 << 19;
-}
-
-void TestController::windowForVisibleRows()
-{
-    QFETCH(int, top);
-    QFETCH(int, bottom);
-    QFETCH(int, perPage);
-    QFETCH(int, listLength);
-    QFETCH(int, minRow);
-    QFETCH(int, maxRow);
-    loadAlphabetBar();
-    Mavrosk::PhoneSource::instance()->phoneBook()->setListLength(listLength);
-
-    m_controller->calculateDriverRestrictedPhonebookMinMaxRows(top, bottom, perPage);
-
-    QCOMPARE(trace(m_since), window(minRow, maxRow));
-}
-
-void TestController::windowForLetter_data()
-{
-    QTest::addColumn<QVariantList>("bar"); // alphabet, letterIndex, ...; empty for the A..E bar
-    QTest::addColumn<QString>("letter");
-    QTest::addColumn<QList<int>>("rows"); // min, max; empty when nothing is set
-
-    const QVariantList ae;
-    QTest::newRow("c") << ae << QStringLiteral("c") << QList<int>{10, 24};
-    QTest::newRow("E runs to the end") << ae << QStringLiteral("E") << QList<int>{40, 59};
-    QTest::newRow("A section of 10 rows") << ae << QStringLiteral("a") << QList<int>{0, 9};
-    QTest::newRow("B has no contacts") << ae << QStringLiteral("B") << QList<int>{-1, -1};
-    QTest::newRow("Z not in the bar") << ae << QStringLiteral("Z") << QList<int>{-1, -1};
-    QTest::newRow("empty letter") << ae << QString() << QList<int>();
-    QTest::newRow("long section gives 20 rows")
-            << QVariantList{QStringLiteral("A"), 0, QStringLiteral("B"), 45} << QStringLiteral("A")
-            << QList<int>{0, 19};
-    QTest::newRow("Greek letters stay apart")
-            << QVariantList{QString(QChar(0x391)), 0, QString(QChar(0x392)), 5}
-            << QString(QChar(0x3B1)) << QList<int>{0, 4};
-    QTest::newRow("Cyrillic does not match an empty entry")
-            << QVariantList{QString(), 0, QStringLiteral("A"), 5} << QString(QChar(0x416))
-            << QList<int>{-1, -1};
-    QTest::newRow("CJK letter") << QVariantList{QString(QChar(0x4E00)), 0, QString(QChar(0x4E8C)),
-                                                8}
-                                << QString(QChar(0x4E00)) << QList<int>{0, 7};
-}
-
-void TestController::windowForLetter()
-{
-    QFETCH(QVariantList, bar);
-    QFETCH(QString, letter);
-    QFETCH(QList<int>, rows);
-    loadAlphabetBar();
-    if (!bar.isEmpty()) {
-        QVariantList entries;
-        for (int i = 0; i < bar.size(); i += 2)
-            entries.append(QVariantMap{{QStringLiteral("alphabet"), bar.at(i)},
-                                       {QStringLiteral("letterIndex"), bar.at(i + 1)}});
-        Mavrosk::PhoneSource::instance()->AlphabetIndexModel()->setRows(entries);
+        QCOMPARE(actual, answers);
     }
 
-    m_controller->driverRestrictedPhonebookFilterByAlpha(letter);
+    void setters_data()
+    {
+        QTest::addColumn<QByteArray>("property");
+        QTest::addColumn<int>("value");
+        QTest::addColumn<int>("stored");
 
-    QCOMPARE(trace(m_since), rows.isEmpty() ? QStringList() : window(rows.at(0), rows.at(1)));
-}
+        QTest::newRow("long press negative is clamped")
+                << QByteArray("longPressInterval") << -5 << 0;
+        QTest::newRow("long press") << QByteArray("longPressInterval") << 1500 << 1500;
+        QTest::newRow("battery low level") << QByteArray("batteryLowLevel") << 2 << 2;
+    }
+
+    void setters()
+    {
+        QFETCH(QByteArray, property);
+        QFETCH(int, value);
+        QFETCH(int, stored);
+
+        const QMetaProperty meta = m_controller->metaObject()->property(
+                m_controller->metaObject()->indexOfProperty(property));
+        QSignalSpy spy(m_controller.get(), meta.notifySignal());
+
+        // The announced value is the stored one, and the same request twice is one change.
+        QVERIFY(m_controller->setProperty(property, value));
+        QVERIFY(m_controller->setProperty(property, value));
+        QCOMPARE(m_controller->property(property).toInt(), stored);
+        QCOMPARE(spy.count(), 1);
+        QCOMPARE(spy.first().first().toInt(), stored);
+    }
+
+    void receivedTextMessageCount()
+    {
+        QSignalSpy spy(m_controller.get(), &HmiPhoneController::receivedTextMessageCountChanged);
+        m_controller->resetRecievedTextMessageCount();
+        QCOMPARE(spy.count(), 0);
+        m_controller->incrementRecievedTextMessageCount();
+        m_controller->incrementRecievedTextMessageCount();
+        m_controller->resetRecievedTextMessageCount();
+        QCOMPARE(spy.count(), 3);
+        QCOMPARE(spy.at(1).first().toInt(), 2);
+        QCOMPARE(spy.at(2).first().toInt(), 0);
+    }
+
+    void windowForVisibleRows_data()
+    {
+        QTest::addColumn<int>("top");
+        QTest::addColumn<int>("bottom");
+        QTest::addColumn<int>("perPage");
+        QTest::addColumn<int>("listLength");
+        QTest::addColumn<int>("minRow");
+        QTest::addColumn<int>("maxRow");
+
+        QTest::newRow("whole C section") << 12 << 15 << 4 << 60 << 10 << 24;
+        QTest::newRow("top of the list") << 0 << 3 << 4 << 60 << 0 << 9;
+        QTest::newRow("E section to the end") << 45 << 48 << 4 << 60 << 40 << 59;
+        QTest::newRow("five rows limit") << 12 << 15 << 1 << 60 << 10 << 14;
+        QTest::newRow("bottom row equals letter count") << 0 << 4 << 4 << 60 << 0 << 9;
+        QTest::newRow("top row below, bottom equals count") << 2 << 4 << 4 << 60 << 0 << 9;
+        QTest::newRow("whole short list on screen") << 0 << 29 << 10 << 30 << 0 << 29;
+        QTest::newRow("whole list, five pages at most") << 0 << 59 << 4 << 60 << 0 << 19;
+    }
+
+    void windowForVisibleRows()
+    {
+        QFETCH(int, top);
+        QFETCH(int, bottom);
+        QFETCH(int, perPage);
+        QFETCH(int, listLength);
+        QFETCH(int, minRow);
+        QFETCH(int, maxRow);
+        loadAlphabetBar();
+        Mavrosk::PhoneSource::instance()->phoneBook()->setListLength(listLength);
+
+        m_controller->calculateDriverRestrictedPhonebookMinMaxRows(top, bottom, perPage);
+
+        QCOMPARE(trace(m_since), window(minRow, maxRow));
+    }
+
+    void windowForLetter_data()
+    {
+        QTest::addColumn<QVariantList>("bar"); // alphabet, letterIndex, ...; empty for the A..E bar
+        QTest::addColumn<QString>("letter");
+        QTest::addColumn<QList<int>>("rows"); // min, max; empty when nothing is set
+
+        const QVariantList ae;
+        QTest::newRow("c") << ae << QStringLiteral("c") << QList<int>{10, 24};
+        QTest::newRow("E runs to the end") << ae << QStringLiteral("E") << QList<int>{40, 59};
+        QTest::newRow("A section of 10 rows") << ae << QStringLiteral("a") << QList<int>{0, 9};
+        QTest::newRow("B has no contacts") << ae << QStringLiteral("B") << QList<int>{-1, -1};
+        QTest::newRow("Z not in the bar") << ae << QStringLiteral("Z") << QList<int>{-1, -1};
+        QTest::newRow("empty letter") << ae << QString() << QList<int>();
+        QTest::newRow("long section gives 20 rows")
+                << QVariantList{QStringLiteral("A"), 0, QStringLiteral("B"), 45}
+                << QStringLiteral("A") << QList<int>{0, 19};
+        QTest::newRow("Greek letters stay apart")
+                << QVariantList{QString(QChar(0x391)), 0, QString(QChar(0x392)), 5}
+                << QString(QChar(0x3B1)) << QList<int>{0, 4};
+        QTest::newRow("Cyrillic does not match an empty entry")
+                << QVariantList{QString(), 0, QStringLiteral("A"), 5} << QString(QChar(0x416))
+                << QList<int>{-1, -1};
+        QTest::newRow("CJK letter")
+                << QVariantList{QString(QChar(0x4E00)), 0, QString(QChar(0x4E8C)), 8}
+                << QString(QChar(0x4E00)) << QList<int>{0, 7};
+    }
+
+    void windowForLetter()
+    {
+        QFETCH(QVariantList, bar);
+        QFETCH(QString, letter);
+        QFETCH(QList<int>, rows);
+        loadAlphabetBar();
+        if (!bar.isEmpty()) {
+            QVariantList entries;
+            for (int i = 0; i < bar.size(); i += 2)
+                entries.append(QVariantMap{{QStringLiteral("alphabet"), bar.at(i)},
+                                           {QStringLiteral("letterIndex"), bar.at(i + 1)}});
+            Mavrosk::PhoneSource::instance()->AlphabetIndexModel()->setRows(entries);
+        }
+
+        m_controller->driverRestrictedPhonebookFilterByAlpha(letter);
+
+        QCOMPARE(trace(m_since), rows.isEmpty() ? QStringList() : window(rows.at(0), rows.at(1)));
+    }
+
+private:
+    TestSupport::FrameworkWarningGuard m_guard;
+    std::unique_ptr<HmiPhoneController> m_controller;
+    qint64 m_since = 0;
+};
 
 QTEST_GUILESS_MAIN(TestController)
 #include "tst_controller.moc"

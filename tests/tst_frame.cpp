@@ -28,247 +28,247 @@ class tst_Frame : public QObject
     Q_OBJECT
 
 private slots:
-    void init();
-    void pluginFileLoads();
-    void integrationAnswersOnlyItsName_data();
-    void integrationAnswersOnlyItsName();
-    void qmlTypesAreUncreatable_data();
-    void qmlTypesAreUncreatable();
-    void contextProperties();
-    void viewIdentifiers();
-    void intentActions_data();
-    void intentActions();
-    void callActionFollowsConnection();
+    void init()
+    {
+        Mavrosk::resetAll();
+        m_mark = Platform::Journal::instance()->lastSequence();
+    }
+
+    void pluginFileLoads()
+    {
+        QPluginLoader loader(QStringLiteral(HMIPHONE_PLUGIN_FILE));
+        QCOMPARE(loader.metaData().value(QLatin1String("IID")).toString(),
+                 QStringLiteral("com.orvane.ivi.ModuleInterface"));
+        QCOMPARE(loader.metaData().value(QLatin1String("className")).toString(),
+                 QStringLiteral("HmiPhoneModule"));
+        const QJsonObject metaData = loader.metaData().value(QLatin1String("MetaData")).toObject();
+        QCOMPARE(metaData.value(QLatin1String("Name")).toString(), QStringLiteral("HmiPhone"));
+        QCOMPARE(metaData.value(QLatin1String("Description")).toString(),
+                 QStringLiteral("Phone module plugin"));
+
+        QObject *instance = loader.instance();
+        QVERIFY2(instance, qPrintable(loader.errorString()));
+        QVERIFY(instance->inherits("HmiPhoneModule"));
+        auto *module = qobject_cast<Taldris::ModuleInterface *>(instance);
+        QVERIFY(module);
+
+        QObject parent;
+        Taldris::HmiModuleIntegration *integration
+                = module->createModuleIntegration(QStringLiteral("HmiPhone"), &parent);
+        QVERIFY(integration);
+        QCOMPARE(integration->parent(), &parent);
+        QCOMPARE(integration->moduleName(), QStringLiteral("Phone"));
+        QCOMPARE(integration->modulePriority(), 30);
+        QCOMPARE(integration->moduleDomain(), 2);
+        QCOMPARE(integration->moduleId(), QStringLiteral("PHONE"));
+        QCOMPARE(integration->viewDescriptorFile(),
+                 QStringLiteral("plugins/hmiphone/view-descriptor.json"));
+        QVERIFY(integration->rootStateIdentifier().endsWith(QLatin1String("Root")));
+        QCOMPARE(integration->iconUrl().toString(), QStringLiteral("menubar/icon_phone"));
+    }
+
+    void integrationAnswersOnlyItsName_data()
+    {
+        QTest::addColumn<QString>("name");
+        QTest::addColumn<bool>("answers");
+        QTest::newRow("HmiPhone") << QStringLiteral("HmiPhone") << true;
+        QTest::newRow("lower case") << QStringLiteral("hmiphone") << false;
+        QTest::newRow("module name") << QStringLiteral("Phone") << false;
+        QTest::newRow("empty") << QString() << false;
+    }
+
+    void integrationAnswersOnlyItsName()
+    {
+        QFETCH(QString, name);
+        QFETCH(bool, answers);
+        HmiPhoneModule module;
+        QObject parent;
+        Taldris::HmiModuleIntegration *first = module.createModuleIntegration(name, &parent);
+        Taldris::HmiModuleIntegration *second = module.createModuleIntegration(name, &parent);
+        QCOMPARE(first != nullptr, answers);
+        if (answers)
+            QVERIFY(first != second);
+    }
+
+    void qmlTypesAreUncreatable_data()
+    {
+        QTest::addColumn<QString>("type");
+        for (const char *type : {"HmiPhoneIntegration", "HmiPhoneController", "PhoneSource",
+                                 "EAPhoneSource", "BluetoothSource", "ProjectionSource"})
+            QTest::newRow(type) << QString::fromLatin1(type);
+    }
+
+    void qmlTypesAreUncreatable()
+    {
+        QFETCH(QString, type);
+        HmiPhoneIntegration integration;
+        integration.registerTypes();
+        QQmlEngine engine;
+        QQmlComponent component(&engine);
+        component.setData(QStringLiteral("import HmiPhone 1.0\n%1 {}\n").arg(type).toUtf8(),
+                          QUrl());
+        QVERIFY(component.isError());
+        QVERIFY2(component.errorString().contains(type + QLatin1String(" is not creatable")),
+                 qPrintable(component.errorString()));
+    }
+
+    void contextProperties()
+    {
+        HmiPhoneIntegration integration;
+        QQmlEngine engine;
+        integration.exportObjects(engine.rootContext());
+        QCOMPARE(engine.rootContext()
+                         ->contextProperty(QStringLiteral("_hmiphone"))
+                         .value<QObject *>(),
+                 &integration);
+        QObject *controller = engine.rootContext()
+                                      ->contextProperty(QStringLiteral("_hmiphoneController"))
+                                      .value<QObject *>();
+        QVERIFY(qobject_cast<HmiPhoneController *>(controller));
+        QCOMPARE(controller->parent(), &integration);
+        // Before the host asks for the screens there are no root-hierarchy lists to hand over.
+        QVERIFY(integration.moduleRootHierarchyTransitions().isEmpty());
+        QVERIFY(integration.moduleRootHierarchyPopupStates().isEmpty());
+    }
+
+    void viewIdentifiers()
+    {
+        HmiPhoneIntegration integration;
+        QCOMPARE(integration.createViewIdentifier(QStringLiteral("IncomingCall")),
+                 Views::IncomingCall);
+        QVERIFY(Views::siriFeatureNotEnabledPopup.endsWith(
+                QLatin1String("siriFeatureNotEnabledPopup")));
+        QVERIFY(Views::PhoneStatusAlertPopup75.endsWith(QLatin1String("PhoneStatusAlertPopup75")));
+        QVERIFY(Views::PhoneMenu != Views::PhoneMenu + QLatin1Char(' '));
+        QVERIFY(!Views::PhoneBook.isEmpty());
+    }
+
+    void intentActions_data()
+    {
+        QTest::addColumn<int>("action");
+        QTest::addColumn<QVariantList>("arguments");
+        QTest::addColumn<bool>("connected");
+        QTest::addColumn<bool>("result");
+        // What the HMI sees: an event the controller posted (journaled), an event posted straight
+        // to the machine, or a view request.
+        QTest::addColumn<QString>("kind");
+        QTest::addColumn<QString>("what");
+
+        const QString number = QStringLiteral("0123456789");
+        QTest::newRow("1: number, second argument ignored")
+                << 1 << QVariantList{number, 42} << true << true << QStringLiteral("event")
+                << QStringLiteral("HmiPhone_MakeCallRequest");
+        QTest::newRow("1: no arguments")
+                << 1 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("1: no phone") << 1 << QVariantList{number} << false << false
+                                     << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("1: empty number") << 1 << QVariantList{QString()} << true << false
+                                         << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("1: a list") << 1 << QVariantList{QVariant(QVariantList{1, 2})} << true
+                                   << false << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("1: a map") << 1 << QVariantList{QVariantMap{{QStringLiteral("n"), number}}}
+                                  << true << false << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("28 add phone")
+                << 28 << QVariantList{} << false << true << QStringLiteral("machine")
+                << QStringLiteral("HmiPhone_AddPhoneRequest");
+        QTest::newRow("32 alerts")
+                << 32 << QVariantList{} << false << true << QStringLiteral("machine")
+                << QStringLiteral("HmiPhone_ShowStatusBarAlertsRequest");
+        QTest::newRow("47 siri") << 47 << QVariantList{} << false << true
+                                 << QStringLiteral("machine")
+                                 << QStringLiteral("HmiPhone_ShowSiriNotEnabledRequest");
+        QTest::newRow("56 root") << 56 << QVariantList{} << false << true
+                                 << QStringLiteral("machine")
+                                 << QStringLiteral("HmiPhone_RootStateRequest");
+        QTest::newRow("67 phonebook")
+                << 67 << QVariantList{} << false << true << QStringLiteral("machine")
+                << QStringLiteral("HmiPhone_PhoneBookStatusCheck");
+        QTest::newRow("7 settings")
+                << 7 << QVariantList{} << false << true << QStringLiteral("view-request")
+                << QStringLiteral("PhoneSettingsRoot");
+        QTest::newRow("68 contacts settings")
+                << 68 << QVariantList{} << false << true << QStringLiteral("view-request")
+                << QStringLiteral("PhoneManageContactsSettings");
+        QTest::newRow("2 not handled")
+                << 2 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
+        QTest::newRow("0 not handled")
+                << 0 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
+    }
+
+    void intentActions()
+    {
+        QFETCH(int, action);
+        QFETCH(QVariantList, arguments);
+        QFETCH(bool, connected);
+        QFETCH(bool, result);
+        QFETCH(QString, kind);
+        QFETCH(QString, what);
+
+        HmiPhoneModule module;
+        Host::ModuleHost host;
+        host.use(&module);
+        QVERIFY(host.setUp(QStringLiteral("HmiPhone")));
+        host.start();
+        // Another part of the HMI listening to the events that the phone posts to the machine (on a
+        // state that stays active when the phone opens one of its screens).
+        QSignalSpy heard(
+                new Quorvel::HmiTransition(
+                        what, Quorvel::StateMachine::instance()->levelState(Quorvel::StateLevel1)),
+                &QAbstractTransition::triggered);
+        Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
+                                                             connected);
+        Mavrosk::PhoneSource::instance()->setBridgeValue(QStringLiteral("callNumberEntered"),
+                                                         QStringLiteral("555"));
+
+        QCOMPARE(Taldris::HmiIntentManager::instance()->requestAction(action, arguments), result);
+        TestSupport::processUntilIdle();
+
+        const QString entered = Mavrosk::PhoneSource::instance()->callNumberEntered();
+        QCOMPARE(entered,
+                 action == 1 && result ? arguments.first().toString() : QStringLiteral("555"));
+        // Events reach the machine whether the controller or the handler posted them.
+        const bool posted = kind == QLatin1String("machine") || kind == QLatin1String("event");
+        QCOMPARE(heard.count(), posted ? 1 : 0);
+        if (kind == QLatin1String("event")) {
+            QCOMPARE(TestSupport::journalValues(kind, QStringLiteral("name"), m_mark),
+                     QStringList{what});
+        } else if (kind == QLatin1String("view-request")) {
+            const QStringList views
+                    = TestSupport::journalValues(kind, QStringLiteral("id"), m_mark);
+            QCOMPARE(views.size(), 1);
+            QVERIFY(views.first().endsWith(what));
+        }
+        if (!result) {
+            QVERIFY(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"),
+                                               m_mark)
+                            .isEmpty());
+        }
+    }
+
+    void callActionFollowsConnection()
+    {
+        HmiPhoneIntegration integration;
+        auto *manager = Taldris::HmiIntentManager::instance();
+        QSignalSpy status(manager, &Taldris::HmiIntentManager::actionStatusChanged);
+        QVERIFY(!manager->isActionEnabled(1));
+        QVERIFY(!manager->isActionEnabled(28));
+
+        Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
+                                                             true);
+        QVERIFY(manager->isActionEnabled(1));
+        QVERIFY(!manager->isActionEnabled(28));
+        Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
+                                                             false);
+        QVERIFY(!manager->isActionEnabled(1));
+
+        QCOMPARE(status.count(), 2);
+        QCOMPARE(status.at(0), (QVariantList{1, true}));
+        QCOMPARE(status.at(1), (QVariantList{1, false}));
+    }
 
 private:
     qint64 m_mark = 0;
 };
-
-void tst_Frame::init()
-{
-    Mavrosk::resetAll();
-    m_mark = Platform::Journal::instance()->lastSequence();
-}
-
-void tst_Frame::pluginFileLoads()
-{
-    QPluginLoader loader(QStringLiteral(HMIPHONE_PLUGIN_FILE));
-    QCOMPARE(loader.metaData().value(QLatin1String("IID")).toString(),
-             QStringLiteral("com.orvane.ivi.ModuleInterface"));
-    QCOMPARE(loader.metaData().value(QLatin1String("className")).toString(),
-             QStringLiteral("HmiPhoneModule"));
-    const QJsonObject metaData = loader.metaData().value(QLatin1String("MetaData")).toObject();
-    QCOMPARE(metaData.value(QLatin1String("Name")).toString(), QStringLiteral("HmiPhone"));
-    QCOMPARE(metaData.value(QLatin1String("Description")).toString(),
-             QStringLiteral("Phone module plugin"));
-
-    QObject *instance = loader.instance();
-    QVERIFY2(instance, qPrintable(loader.errorString()));
-    QVERIFY(instance->inherits("HmiPhoneModule"));
-    auto *module = qobject_cast<Taldris::ModuleInterface *>(instance);
-    QVERIFY(module);
-
-    QObject parent;
-    Taldris::HmiModuleIntegration *integration
-            = module->createModuleIntegration(QStringLiteral("HmiPhone"), &parent);
-    QVERIFY(integration);
-    QCOMPARE(integration->parent(), &parent);
-    QCOMPARE(integration->moduleName(), QStringLiteral("Phone"));
-    QCOMPARE(integration->modulePriority(), 30);
-    QCOMPARE(integration->moduleDomain(), 2);
-    QCOMPARE(integration->moduleId(), QStringLiteral("PHONE"));
-    QCOMPARE(integration->viewDescriptorFile(),
-             QStringLiteral("plugins/hmiphone/view-descriptor.json"));
-    QVERIFY(integration->rootStateIdentifier().endsWith(QLatin1String("Root")));
-    QCOMPARE(integration->iconUrl().toString(), QStringLiteral("menubar/icon_phone"));
-}
-
-void tst_Frame::integrationAnswersOnlyItsName_data()
-{
-    QTest::addColumn<QString>("name");
-    QTest::addColumn<bool>("answers");
-    QTest::newRow("HmiPhone") << QStringLiteral("HmiPhone") << true;
-    QTest::newRow("lower case") << QStringLiteral("hmiphone") << false;
-    QTest::newRow("module name") << QStringLiteral("Phone") << false;
-    QTest::newRow("empty") << QString() << false;
-}
-
-void tst_Frame::integrationAnswersOnlyItsName()
-{
-    QFETCH(QString, name);
-    QFETCH(bool, answers);
-    HmiPhoneModule module;
-    QObject parent;
-    Taldris::HmiModuleIntegration *first = module.createModuleIntegration(name, &parent);
-    Taldris::HmiModuleIntegration *second = module.createModuleIntegration(name, &parent);
-    QCOMPARE(first != nullptr, answers);
-    if (answers)
-        QVERIFY(first != second);
-}
-
-void tst_Frame::qmlTypesAreUncreatable_data()
-{
-    QTest::addColumn<QString>("type");
-    for (const char *type : {"HmiPhoneIntegration", "HmiPhoneController", "PhoneSource",
-                             "EAPhoneSource", "BluetoothSource", "ProjectionSource"})
-        QTest::newRow(type) << QString::fromLatin1(type);
-}
-
-void tst_Frame::qmlTypesAreUncreatable()
-{
-    QFETCH(QString, type);
-    HmiPhoneIntegration integration;
-    integration.registerTypes();
-    QQmlEngine engine;
-    QQmlComponent component(&engine);
-    component.setData(QStringLiteral("import HmiPhone 1.0\n%1 {}\n").arg(type).toUtf8(), QUrl());
-    QVERIFY(component.isError());
-    QVERIFY2(component.errorString().contains(type + QLatin1String(" is not creatable")),
-             qPrintable(component.errorString()));
-}
-
-void tst_Frame::contextProperties()
-{
-    HmiPhoneIntegration integration;
-    QQmlEngine engine;
-    integration.exportObjects(engine.rootContext());
-    QCOMPARE(engine.rootContext()->contextProperty(QStringLiteral("_hmiphone")).value<QObject *>(),
-             &integration);
-    QObject *controller = engine.rootContext()
-                                  ->contextProperty(QStringLiteral("_hmiphoneController"))
-                                  .value<QObject *>();
-    QVERIFY(qobject_cast<HmiPhoneController *>(controller));
-    QCOMPARE(controller->parent(), &integration);
-    // Before the host asks for the screens there are no root-hierarchy lists to hand over.
-    QVERIFY(integration.moduleRootHierarchyTransitions().isEmpty());
-    QVERIFY(integration.moduleRootHierarchyPopupStates().isEmpty());
-}
-
-void tst_Frame::viewIdentifiers()
-{
-    HmiPhoneIntegration integration;
-    QCOMPARE(integration.createViewIdentifier(QStringLiteral("IncomingCall")), Views::IncomingCall);
-    QVERIFY(Views::siriFeatureNotEnabledPopup.endsWith(
-            QLatin1String("siriFeatureNotEnabledPopup")));
-    QVERIFY(Views::PhoneStatusAlertPopup75.endsWith(QLatin1String("PhoneStatusAlertPopup75")));
-    QVERIFY(Views::PhoneMenu != Views::PhoneMenu + QLatin1Char(' '));
-    QVERIFY(!Views::PhoneBook.isEmpty());
-}
-
-void tst_Frame::intentActions_data()
-{
-    QTest::addColumn<int>("action");
-    QTest::addColumn<QVariantList>("arguments");
-    QTest::addColumn<bool>("connected");
-    QTest::addColumn<bool>("result");
-    // What the HMI sees: an event the controller posted (journaled), an event posted straight to
-    // the machine, or a view request.
-    QTest::addColumn<QString>("kind");
-    QTest::addColumn<QString>("what");
-
-    const QString number = QStringLiteral("0123456789");
-    QTest::newRow("1: number, second argument ignored")
-            << 1 << QVariantList{number, 42} << true << true << QStringLiteral("event")
-            << QStringLiteral("HmiPhone_MakeCallRequest");
-    QTest::newRow("1: no arguments")
-            << 1 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("1: no phone") << 1 << QVariantList{number} << false << false
-                                 << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("1: empty number") << 1 << QVariantList{QString()} << true << false
-                                     << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("1: a list") << 1 << QVariantList{QVariant(QVariantList{1, 2})} << true << false
-                               << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("1: a map") << 1 << QVariantList{QVariantMap{{QStringLiteral("n"), number}}}
-                              << true << false << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("28 add phone") << 28 << QVariantList{} << false << true
-                                  << QStringLiteral("machine")
-                                  << QStringLiteral("HmiPhone_AddPhoneRequest");
-    QTest::newRow("32 alerts") << 32 << QVariantList{} << false << true << QStringLiteral("machine")
-                               << QStringLiteral("HmiPhone_ShowStatusBarAlertsRequest");
-    QTest::newRow("47 siri") << 47 << QVariantList{} << false << true << QStringLiteral("machine")
-                             << QStringLiteral("HmiPhone_ShowSiriNotEnabledRequest");
-    QTest::newRow("56 root") << 56 << QVariantList{} << false << true << QStringLiteral("machine")
-                             << QStringLiteral("HmiPhone_RootStateRequest");
-    QTest::newRow("67 phonebook") << 67 << QVariantList{} << false << true
-                                  << QStringLiteral("machine")
-                                  << QStringLiteral("HmiPhone_PhoneBookStatusCheck");
-    QTest::newRow("7 settings") << 7 << QVariantList{} << false << true
-                                << QStringLiteral("view-request")
-                                << QStringLiteral("PhoneSettingsRoot");
-    QTest::newRow("68 contacts settings")
-            << 68 << QVariantList{} << false << true << QStringLiteral("view-request")
-            << QStringLiteral("PhoneManageContactsSettings");
-    QTest::newRow("2 not handled")
-            << 2 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
-    QTest::newRow("0 not handled")
-            << 0 << QVariantList{} << true << false << QStringLiteral("") << QStringLiteral("");
-}
-
-void tst_Frame::intentActions()
-{
-    QFETCH(int, action);
-    QFETCH(QVariantList, arguments);
-    QFETCH(bool, connected);
-    QFETCH(bool, result);
-    QFETCH(QString, kind);
-    QFETCH(QString, what);
-
-    HmiPhoneModule module;
-    Host::ModuleHost host;
-    host.use(&module);
-    QVERIFY(host.setUp(QStringLiteral("HmiPhone")));
-    host.start();
-    // Another part of the HMI listening to the events that the phone posts to the machine (on a
-    // state that stays active when the phone opens one of its screens).
-    QSignalSpy heard(new Quorvel::HmiTransition(
-                             what, Quorvel::StateMachine::instance()->levelState(
-                                           Quorvel::StateLevel1)),
-                     &QAbstractTransition::triggered);
-    Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
-                                                         connected);
-    Mavrosk::PhoneSource::instance()->setBridgeValue(QStringLiteral("callNumberEntered"),
-                                                     QStringLiteral("555"));
-
-    QCOMPARE(Taldris::HmiIntentManager::instance()->requestAction(action, arguments), result);
-    TestSupport::processUntilIdle();
-
-    const QString entered = Mavrosk::PhoneSource::instance()->callNumberEntered();
-    QCOMPARE(entered, action == 1 && result ? arguments.first().toString() : QStringLiteral("555"));
-    // Events reach the machine whether the controller or the handler posted them.
-    const bool posted = kind == QLatin1String("machine") || kind == QLatin1String("event");
-    QCOMPARE(heard.count(), posted ? 1 : 0);
-    if (kind == QLatin1String("event")) {
-        QCOMPARE(TestSupport::journalValues(kind, QStringLiteral("name"), m_mark),
-                 QStringList{what});
-    } else if (kind == QLatin1String("view-request")) {
-        const QStringList views = TestSupport::journalValues(kind, QStringLiteral("id"), m_mark);
-        QCOMPARE(views.size(), 1);
-        QVERIFY(views.first().endsWith(what));
-    }
-    if (!result) {
-        QVERIFY(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), m_mark)
-                        .isEmpty());
-    }
-}
-
-void tst_Frame::callActionFollowsConnection()
-{
-    HmiPhoneIntegration integration;
-    auto *manager = Taldris::HmiIntentManager::instance();
-    QSignalSpy status(manager, &Taldris::HmiIntentManager::actionStatusChanged);
-    QVERIFY(!manager->isActionEnabled(1));
-    QVERIFY(!manager->isActionEnabled(28));
-
-    Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"), true);
-    QVERIFY(manager->isActionEnabled(1));
-    QVERIFY(!manager->isActionEnabled(28));
-    Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"), false);
-    QVERIFY(!manager->isActionEnabled(1));
-
-    QCOMPARE(status.count(), 2);
-    QCOMPARE(status.at(0), (QVariantList{1, true}));
-    QCOMPARE(status.at(1), (QVariantList{1, false}));
-}
 
 QTEST_GUILESS_MAIN(tst_Frame)
 #include "tst_frame.moc"

@@ -18,23 +18,6 @@
 
 using namespace HmiPhone;
 
-class TestPhonePlugin : public QObject
-{
-    Q_OBJECT
-
-private slots:
-    void init();
-    void cleanup();
-    void screenTree();
-    void firstScreen_data();
-    void firstScreen();
-
-private:
-    TestSupport::FrameworkWarningGuard m_guard;
-    QScopedPointer<QQmlEngine> m_engine;
-    QScopedPointer<Host::ModuleHost> m_host;
-};
-
 // The phone's states by object name, "parent/child" below the listed components; a layered
 // state's ordinary children come first, then the popups of its layer.
 static QStringList tree(const QState *state, const QStringList &descend, const QString &prefix = {})
@@ -57,111 +40,126 @@ static QStringList tree(const QState *state, const QStringList &descend, const Q
     return names;
 }
 
-void TestPhonePlugin::init()
+class TestPhonePlugin : public QObject
 {
-    Mavrosk::resetAll();
-    m_engine.reset(new QQmlEngine);
-    m_host.reset(new Host::ModuleHost);
-    QVERIFY2(m_host->load(QStringLiteral(HMIPHONE_PLUGIN_FILE)), qPrintable(m_host->errorString()));
-    QVERIFY(m_host->setUp(QStringLiteral("HmiPhone"), m_engine.data()));
-    m_host->start();
-}
+    Q_OBJECT
 
-void TestPhonePlugin::cleanup()
-{
-    m_host.reset();
-    m_engine.reset();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-}
-
-void TestPhonePlugin::screenTree()
-{
-    QState *root = m_host->moduleRoot();
-    QVERIFY(root);
-    QCOMPARE(root->objectName(), m_host->integration()->rootStateIdentifier());
-    QCOMPARE(root->parentState(), m_host->moduleParent());
-
-    const QStringList expected
-            = QStringLiteral(
-                      "PhoneCallCmp PhoneCallCmp/CallInProgressViewState "
-                      "PhoneCallCmp/KeypadInCallViewState "
-                      "PhoneBookCmp PhoneBookCmp/PhoneBookEmptyViewState "
-                      "PhoneBookCmp/PhoneBookListViewState "
-                      "PhoneBookCmp/PhoneBookSearchViewState PhoneBookCmp/ContactDetailsViewState "
-                      "PhoneBookCmp/PhoneBook_CmpConditionalState PhoneEmgcyAsst "
-                      "PhoneStatusAlertsCmp "
-                      "HmiPhone_Limbo PhoneMenuViewState DialKeypadViewState "
-                      "RecentCallsListViewState "
-                      "RecentCallsListViewState/RecentCallsListViewStateView "
-                      "RecentCallsListViewState/%1 RecentCallsListViewState/%2 "
-                      "RecentCallsListViewState/%3 "
-                      "RecentCallsListViewState/%4 Phone_CmpConditionalState PhoneSmsCmp "
-                      "PhoneSmsCmp/PhoneSmsListViewState PhoneSmsCmp/PhoneSmsReplyListViewState "
-                      "PhoneSmsCmp/PhoneSmsViewState %5 %6 %7 %8 %9 %10 %11")
-                      .arg(Views::RecentCallsDownloading, Views::RecentCallsDownloadFailed,
-                           Views::RecentCallsRetryError, Views::RecentCallsFailedCallKOVA,
-                           Views::PhoneDndActiveArdel, Views::PhoneSmsNotSupported,
-                           Views::PhoneSmsWaitingForResponseFromPhone,
-                           Views::PhoneSmsAccessNotGranted, Views::PhoneSmsDownloading)
-                      .arg(Views::PhoneSmsDownloadFailed, Views::PhoneSmsRetryDownloadFailed)
-                      .split(QLatin1Char(' '));
-    const QStringList components{QStringLiteral("PhoneCallCmp"), QStringLiteral("PhoneBookCmp"),
-                                 QStringLiteral("RecentCallsListViewState"),
-                                 QStringLiteral("PhoneSmsCmp")};
-    QCOMPARE(tree(root, components), expected);
-
-    // The contacts popups are handed to the root of the machine, not kept in the phone's tree.
-    for (const QString &popup : {Views::PhoneBookDownloading, Views::PhoneBookAccessNotGranted}) {
-        QVERIFY2(!root->findChild<QState *>(popup), qPrintable(popup));
-        QVERIFY2(Quorvel::StateMachine::instance()->popupState(popup), qPrintable(popup));
+private slots:
+    void init()
+    {
+        Mavrosk::resetAll();
+        m_engine.reset(new QQmlEngine);
+        m_host.reset(new Host::ModuleHost);
+        QVERIFY2(m_host->load(QStringLiteral(HMIPHONE_PLUGIN_FILE)),
+                 qPrintable(m_host->errorString()));
+        QVERIFY(m_host->setUp(QStringLiteral("HmiPhone"), m_engine.data()));
+        m_host->start();
     }
-}
 
-void TestPhonePlugin::firstScreen_data()
-{
-    QTest::addColumn<bool>("connected");
-    QTest::addColumn<int>("status");
-    QTest::addColumn<int>("emergency");
-    QTest::addColumn<QString>("expected");
+    void cleanup()
+    {
+        m_host.reset();
+        m_engine.reset();
+        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
+    }
 
-    QTest::addRow("no phone") << false << 0 << 0 << QStringLiteral("HmiPhone_Limbo");
-    QTest::addRow("call") << true << 4 << 0 << QStringLiteral("CallInProgressViewState");
-    QTest::addRow("emergency") << true << 0 << 1 << QStringLiteral("PhoneEmgcyAsst");
-    QTest::addRow("phone menu") << true << 0 << 0 << QStringLiteral("PhoneMenuViewState");
-}
+    void screenTree()
+    {
+        QState *root = m_host->moduleRoot();
+        QVERIFY(root);
+        QCOMPARE(root->objectName(), m_host->integration()->rootStateIdentifier());
+        QCOMPARE(root->parentState(), m_host->moduleParent());
 
-void TestPhonePlugin::firstScreen()
-{
-    QFETCH(bool, connected);
-    QFETCH(int, status);
-    QFETCH(int, emergency);
-    QFETCH(QString, expected);
+        const QStringList expected
+                = QStringLiteral(
+                          "PhoneCallCmp PhoneCallCmp/CallInProgressViewState "
+                          "PhoneCallCmp/KeypadInCallViewState "
+                          "PhoneBookCmp PhoneBookCmp/PhoneBookEmptyViewState "
+                          "PhoneBookCmp/PhoneBookListViewState "
+                          "PhoneBookCmp/PhoneBookSearchViewState "
+                          "PhoneBookCmp/ContactDetailsViewState "
+                          "PhoneBookCmp/PhoneBook_CmpConditionalState PhoneEmgcyAsst "
+                          "PhoneStatusAlertsCmp "
+                          "HmiPhone_Limbo PhoneMenuViewState DialKeypadViewState "
+                          "RecentCallsListViewState "
+                          "RecentCallsListViewState/RecentCallsListViewStateView "
+                          "RecentCallsListViewState/%1 RecentCallsListViewState/%2 "
+                          "RecentCallsListViewState/%3 "
+                          "RecentCallsListViewState/%4 Phone_CmpConditionalState PhoneSmsCmp "
+                          "PhoneSmsCmp/PhoneSmsListViewState "
+                          "PhoneSmsCmp/PhoneSmsReplyListViewState "
+                          "PhoneSmsCmp/PhoneSmsViewState %5 %6 %7 %8 %9 %10 %11")
+                          .arg(Views::RecentCallsDownloading, Views::RecentCallsDownloadFailed,
+                               Views::RecentCallsRetryError, Views::RecentCallsFailedCallKOVA,
+                               Views::PhoneDndActiveArdel, Views::PhoneSmsNotSupported,
+                               Views::PhoneSmsWaitingForResponseFromPhone,
+                               Views::PhoneSmsAccessNotGranted, Views::PhoneSmsDownloading)
+                          .arg(Views::PhoneSmsDownloadFailed, Views::PhoneSmsRetryDownloadFailed)
+                          .split(QLatin1Char(' '));
+        const QStringList components{QStringLiteral("PhoneCallCmp"), QStringLiteral("PhoneBookCmp"),
+                                     QStringLiteral("RecentCallsListViewState"),
+                                     QStringLiteral("PhoneSmsCmp")};
+        QCOMPARE(tree(root, components), expected);
 
-    // The phone menu's entry and exit reach QML through the controller's signals.
-    QObject *controller = m_engine->rootContext()
-                                  ->contextProperty(QStringLiteral("_hmiphoneController"))
-                                  .value<QObject *>();
-    QVERIFY(controller);
-    QSignalSpy entered(controller, SIGNAL(phoneMenuEntered()));
-    QSignalSpy exited(controller, SIGNAL(phoneMenuExited()));
+        // The contacts popups are handed to the root of the machine, not kept in the phone's tree.
+        for (const QString &popup :
+             {Views::PhoneBookDownloading, Views::PhoneBookAccessNotGranted}) {
+            QVERIFY2(!root->findChild<QState *>(popup), qPrintable(popup));
+            QVERIFY2(Quorvel::StateMachine::instance()->popupState(popup), qPrintable(popup));
+        }
+    }
 
-    Mavrosk::BluetoothSource::instance()->setDeviceConnected(connected);
-    Mavrosk::PhoneSource::instance()->setStatus(status);
-    Mavrosk::PhoneSource::instance()->setEmergencyCallStatus(emergency);
-    m_host->openModule();
-    TestSupport::processUntilIdle();
+    void firstScreen_data()
+    {
+        QTest::addColumn<bool>("connected");
+        QTest::addColumn<int>("status");
+        QTest::addColumn<int>("emergency");
+        QTest::addColumn<QString>("expected");
 
-    QStringList active;
-    for (const QAbstractState *state : Quorvel::StateMachine::instance()->configuration())
-        active.append(state->objectName());
-    QVERIFY2(active.contains(expected), qPrintable(active.join(QLatin1Char(' '))));
+        QTest::addRow("no phone") << false << 0 << 0 << QStringLiteral("HmiPhone_Limbo");
+        QTest::addRow("call") << true << 4 << 0 << QStringLiteral("CallInProgressViewState");
+        QTest::addRow("emergency") << true << 0 << 1 << QStringLiteral("PhoneEmgcyAsst");
+        QTest::addRow("phone menu") << true << 0 << 0 << QStringLiteral("PhoneMenuViewState");
+    }
 
-    const int menuEntries = expected == QLatin1String("PhoneMenuViewState") ? 1 : 0;
-    QCOMPARE(entered.count(), menuEntries);
-    m_host->openHome();
-    TestSupport::processUntilIdle();
-    QCOMPARE(exited.count(), menuEntries);
-}
+    void firstScreen()
+    {
+        QFETCH(bool, connected);
+        QFETCH(int, status);
+        QFETCH(int, emergency);
+        QFETCH(QString, expected);
+
+        // The phone menu's entry and exit reach QML through the controller's signals.
+        QObject *controller = m_engine->rootContext()
+                                      ->contextProperty(QStringLiteral("_hmiphoneController"))
+                                      .value<QObject *>();
+        QVERIFY(controller);
+        QSignalSpy entered(controller, SIGNAL(phoneMenuEntered()));
+        QSignalSpy exited(controller, SIGNAL(phoneMenuExited()));
+
+        Mavrosk::BluetoothSource::instance()->setDeviceConnected(connected);
+        Mavrosk::PhoneSource::instance()->setStatus(status);
+        Mavrosk::PhoneSource::instance()->setEmergencyCallStatus(emergency);
+        m_host->openModule();
+        TestSupport::processUntilIdle();
+
+        QStringList active;
+        for (const QAbstractState *state : Quorvel::StateMachine::instance()->configuration())
+            active.append(state->objectName());
+        QVERIFY2(active.contains(expected), qPrintable(active.join(QLatin1Char(' '))));
+
+        const int menuEntries = expected == QLatin1String("PhoneMenuViewState") ? 1 : 0;
+        QCOMPARE(entered.count(), menuEntries);
+        m_host->openHome();
+        TestSupport::processUntilIdle();
+        QCOMPARE(exited.count(), menuEntries);
+    }
+
+private:
+    TestSupport::FrameworkWarningGuard m_guard;
+    QScopedPointer<QQmlEngine> m_engine;
+    QScopedPointer<Host::ModuleHost> m_host;
+};
 
 QTEST_GUILESS_MAIN(TestPhonePlugin)
 #include "tst_phoneplugin.moc"
