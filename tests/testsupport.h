@@ -112,9 +112,8 @@ private:
     }
     static void handle(QtMsgType type, const QMessageLogContext &context, const QString &message)
     {
-        static const char *const watched[]
-                = {"QStateMachine", "QState::", "QSignalTransition", "No such signal",
-                   "Missing initial state"};
+        static const char *const watched[] = {"QStateMachine", "QState::", "QSignalTransition",
+                                              "No such signal", "Missing initial state"};
         if (type == QtWarningMsg)
             for (const char *text : watched)
                 if (message.contains(QLatin1String(text))) {

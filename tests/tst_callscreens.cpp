@@ -137,66 +137,48 @@ private slots:
                  (QStringList{Views::CallInProgress, Views::KeypadInCall, Views::CallInProgress}));
     }
 
-    void keyTone_data()
+    // Requests on the call screens: key tones carry [tone code, text] and go on the in-call
+    // keypad; mute and privacy act on the call view only. The screen stays as it was.
+    void callRequests_data()
     {
+        QTest::addColumn<bool>("keypadShown");
+        QTest::addColumn<QString>("event");
         QTest::addColumn<QVariant>("data");
         QTest::addColumn<QStringList>("commands");
 
+        const QString tone = Events::HmiPhone_DialPadKeyTonePressed;
+        const QString mute = Events::HmiPhone_MuteRequest;
+        const QString privacy = Events::HmiPhone_PrivacyRequest;
         const QString send = QStringLiteral("phone.dialPadKeyTonePressed(53)");
         const QString record = QStringLiteral("phone.setDTMFNumberEntered(95)");
-        QTest::addRow("53 and 5") << QVariant(QVariantList{53, QStringLiteral("5")})
-                                  << QStringList{send, record};
-        QTest::addRow("no integer, text 5")
-                << QVariant(QVariantList{QStringLiteral("x"), QStringLiteral("5")})
-                << QStringList{record};
-        QTest::addRow("integer, no text")
-                << QVariant(QVariantList{53, QVariant()}) << QStringList{send};
-        QTest::addRow("one element") << QVariant(QVariantList{53}) << QStringList();
+        const QString five = QStringLiteral("5");
+        const QVariant none;
+        // clang-format off
+        QTest::addRow("tone 53 and 5") << true << tone << QVariant(QVariantList{53, five}) << QStringList{send, record};
+        QTest::addRow("tone without an integer") << true << tone << QVariant(QVariantList{QStringLiteral("x"), five}) << QStringList{record};
+        QTest::addRow("tone without a text") << true << tone << QVariant(QVariantList{53, none}) << QStringList{send};
+        QTest::addRow("tone of one element") << true << tone << QVariant(QVariantList{53}) << QStringList();
+        QTest::addRow("mute on the call view") << false << mute << none << QStringList{QStringLiteral("phone.toggleMuted()")};
+        QTest::addRow("privacy on the call view") << false << privacy << none << QStringList{QStringLiteral("phone.togglePrivacyMode()")};
+        QTest::addRow("mute on the in-call keypad") << true << mute << none << QStringList();
+        QTest::addRow("privacy on the in-call keypad") << true << privacy << none << QStringList();
+        // clang-format on
     }
 
-    void keyTone()
+    void callRequests()
     {
+        QFETCH(bool, keypadShown);
+        QFETCH(QString, event);
         QFETCH(QVariant, data);
         QFETCH(QStringList, commands);
 
         phone()->setDTMFNumberEntered(QStringLiteral("9")); // a tone sent earlier in this call
         post(OpenCall);
-        post(Events::HmiPhone_ShowCallKeyPadRequest);
-        const qint64 since = mark();
-        post(Events::HmiPhone_DialPadKeyTonePressed, data);
-        QCOMPARE(bridgeCommandsSince(since), commands);
-    }
-
-    void muteAndPrivacy_data()
-    {
-        QTest::addColumn<bool>("keypadShown");
-        QTest::addColumn<QString>("event");
-        QTest::addColumn<QStringList>("commands");
-
-        QTest::addRow("mute on the call view")
-                << false << Events::HmiPhone_MuteRequest
-                << QStringList{QStringLiteral("phone.toggleMuted()")};
-        QTest::addRow("privacy on the call view")
-                << false << Events::HmiPhone_PrivacyRequest
-                << QStringList{QStringLiteral("phone.togglePrivacyMode()")};
-        QTest::addRow("mute on the in-call keypad")
-                << true << Events::HmiPhone_MuteRequest << QStringList();
-        QTest::addRow("privacy on the in-call keypad")
-                << true << Events::HmiPhone_PrivacyRequest << QStringList();
-    }
-
-    void muteAndPrivacy()
-    {
-        QFETCH(bool, keypadShown);
-        QFETCH(QString, event);
-        QFETCH(QStringList, commands);
-
-        post(OpenCall);
         if (keypadShown)
             post(Events::HmiPhone_ShowCallKeyPadRequest);
         const QStringList before = activeStates();
         const qint64 since = mark();
-        post(event);
+        post(event, data);
         QCOMPARE(bridgeCommandsSince(since), commands);
         QCOMPARE(activeStates(), before);
     }
@@ -211,14 +193,13 @@ private slots:
 
         const QStringList dialing{Transients::PhoneOutgoingDialing};
         const QStringList accepted{Transients::PhoneAcceptedIncomingCall};
+        // clang-format off
         QTest::addRow("dialing, also connected") << true << true << OpenMenu << true << dialing;
-        QTest::addRow("connected after the phone menu")
-                << false << true << OpenMenu << true << accepted;
-        QTest::addRow("connected after the dial keypad")
-                << false << true << OpenKeypad << true << accepted;
-        QTest::addRow("connected after another module")
-                << false << true << OpenHome << true << QStringList();
+        QTest::addRow("connected after the phone menu") << false << true << OpenMenu << true << accepted;
+        QTest::addRow("connected after the dial keypad") << false << true << OpenKeypad << true << accepted;
+        QTest::addRow("connected after another module") << false << true << OpenHome << true << QStringList();
         QTest::addRow("no status bar") << true << true << OpenMenu << false << QStringList();
+        // clang-format on
     }
 
     void entryTransient()

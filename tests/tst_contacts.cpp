@@ -114,12 +114,11 @@ private slots:
         QTest::addColumn<QString>("requests");
         QTest::addColumn<bool>("list");
 
+        // clang-format off
         QTest::addRow("download finishes") << QList<int>{2, 1} << "+Downloading" << true;
-        QTest::addRow("failed twice")
-                << QList<int>{5, 2, 5} << "+DownloadFailed +Downloading +DownloadFailedAgain"
-                << false;
-        QTest::addRow("failed after a download")
-                << QList<int>{5, 1, 5} << "+DownloadFailed +DownloadFailedAgain" << false;
+        QTest::addRow("failed twice") << QList<int>{5, 2, 5} << "+DownloadFailed +Downloading +DownloadFailedAgain" << false;
+        QTest::addRow("failed after a download") << QList<int>{5, 1, 5} << "+DownloadFailed +DownloadFailedAgain" << false;
+        // clang-format on
     }
 
     // Each status change while the contacts are shown chooses the view and the popups again,

@@ -325,16 +325,14 @@ private slots:
         QTest::addColumn<bool>("empty");
 
         const QString full = QString(22, QLatin1Char('1'));
+        // clang-format off
         QTest::newRow("nothing entered yet") << QStringList() << 0 << 0 << false << true;
-        QTest::newRow("empty to one digit")
-                << QStringList{QStringLiteral("1")} << 0 << 1 << false << false;
-        QTest::newRow("one digit to two") << QStringList{QStringLiteral("1"), QStringLiteral("12")}
-                                          << 0 << 1 << false << false;
+        QTest::newRow("empty to one digit") << QStringList{QStringLiteral("1")} << 0 << 1 << false << false;
+        QTest::newRow("one digit to two") << QStringList{QStringLiteral("1"), QStringLiteral("12")} << 0 << 1 << false << false;
         QTest::newRow("22 characters are full") << QStringList{full} << 1 << 1 << true << false;
-        QTest::newRow("23 characters are not")
-                << QStringList{full, full + QLatin1Char('1')} << 2 << 1 << false << false;
-        QTest::newRow("cleared again")
-                << QStringList{QStringLiteral("1"), QString()} << 0 << 2 << false << true;
+        QTest::newRow("23 characters are not") << QStringList{full, full + QLatin1Char('1')} << 2 << 1 << false << false;
+        QTest::newRow("cleared again") << QStringList{QStringLiteral("1"), QString()} << 0 << 2 << false << true;
+        // clang-format on
     }
 
     void numberFlags()

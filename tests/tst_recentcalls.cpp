@@ -66,16 +66,15 @@ private slots:
         QTest::addColumn<bool>("keepType");
         QTest::addColumn<QString>("screen");
 
-        QTest::addRow("available")
-                << 1 << false << "setCurrentRecentCallListType(0) downloadRecentCallsList()";
+        // clang-format off
+        QTest::addRow("available") << 1 << false << "setCurrentRecentCallListType(0) downloadRecentCallsList()";
         QTest::addRow("downloading") << 3 << false << "Downloading setCurrentRecentCallListType(0)";
-        QTest::addRow("failed call")
-                << 4 << false << "FailedCallKOVA setCurrentRecentCallListType(0)";
+        QTest::addRow("failed call") << 4 << false << "FailedCallKOVA setCurrentRecentCallListType(0)";
         QTest::addRow("retry error") << 5 << false << "RetryError setCurrentRecentCallListType(0)";
         QTest::addRow("failed") << 6 << false << "DownloadFailed setCurrentRecentCallListType(0)";
-        QTest::addRow("failed, status 0: no popup")
-                << 0 << false << "setCurrentRecentCallListType(0)";
+        QTest::addRow("failed, status 0: no popup") << 0 << false << "setCurrentRecentCallListType(0)";
         QTest::addRow("entered by event 1263") << 1 << true << "downloadRecentCallsList()";
+        // clang-format on
     }
 
     // Each entry shows the popup of the status, resets the list type (unless entered by an event of

@@ -132,16 +132,14 @@ private slots:
         const QString phoneBook = QStringLiteral("phoneBookStatus");
         const QString downloading = QStringLiteral("messagesDownloadingStatus");
         const QStringList clears{QStringLiteral("phone.clearAlertForThisCycle(1002)")};
+        // clang-format off
         QTest::addRow("contacts downloading") << contacts << phoneBook << 2 << clears << QString();
-        QTest::addRow("contacts failed")
-                << contacts << phoneBook << 5 << QStringList() << Views::PhoneStatusAlertPopup70;
-        QTest::addRow("contacts failed, no retry")
-                << QString() << phoneBook << 5 << QStringList() << QString();
-        QTest::addRow("messages running")
-                << messages << downloading << 2 << QStringList() << QString();
+        QTest::addRow("contacts failed") << contacts << phoneBook << 5 << QStringList() << Views::PhoneStatusAlertPopup70;
+        QTest::addRow("contacts failed, no retry") << QString() << phoneBook << 5 << QStringList() << QString();
+        QTest::addRow("messages running") << messages << downloading << 2 << QStringList() << QString();
         QTest::addRow("messages finished") << messages << downloading << 3 << clears << QString();
-        QTest::addRow("messages failed")
-                << messages << downloading << 4 << QStringList() << Views::PhoneStatusAlertPopup75;
+        QTest::addRow("messages failed") << messages << downloading << 4 << QStringList() << Views::PhoneStatusAlertPopup75;
+        // clang-format on
     }
 
     void retries()

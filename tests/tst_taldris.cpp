@@ -191,12 +191,12 @@ private slots:
         QTest::addColumn<QString>("steps");
         QTest::addColumn<int>("built");
         // "offer", "request", "drop-host" (the host state is destroyed), "drop-submodule".
+        // clang-format off
         QTest::addRow("offered, then requested") << QStringLiteral("offer request") << 1;
         QTest::addRow("requested, then offered") << QStringLiteral("request offer") << 1;
-        QTest::addRow("host state gone before the offer")
-                << QStringLiteral("request drop-host offer") << 0;
-        QTest::addRow("submodule gone before the request")
-                << QStringLiteral("offer drop-submodule request") << 0;
+        QTest::addRow("host state gone before the offer") << QStringLiteral("request drop-host offer") << 0;
+        QTest::addRow("submodule gone before the request") << QStringLiteral("offer drop-submodule request") << 0;
+        // clang-format on
     }
 
     void submoduleProvider()

@@ -36,20 +36,15 @@ private slots:
             return QString::fromLatin1(text).split(QLatin1Char(' '));
         };
 
-        QTest::addRow("options open the message")
-                << steps("options:3") << QStringList{details3} << message;
-        QTest::addRow("hear reads aloud")
-                << steps("hear:2") << QStringList{details2, playback} << list;
-        QTest::addRow("hear, then options")
-                << steps("hear:2 options:3") << QStringList{details2, details3} << message;
-        QTest::addRow("options, then hear")
-                << steps("options:3 hear:2") << QStringList{details3, details2, playback} << list;
-        QTest::addRow("options without index cancel hearing")
-                << steps("hear:2 options:") << QStringList{details2} << message;
-        QTest::addRow("hear with a bad index changes nothing")
-                << steps("options:3 hear:two") << QStringList{details3} << message;
-        QTest::addRow("a negative index asks nothing")
-                << steps("hear:-1") << QStringList() << message;
+        // clang-format off
+        QTest::addRow("options open the message") << steps("options:3") << QStringList{details3} << message;
+        QTest::addRow("hear reads aloud") << steps("hear:2") << QStringList{details2, playback} << list;
+        QTest::addRow("hear, then options") << steps("hear:2 options:3") << QStringList{details2, details3} << message;
+        QTest::addRow("options, then hear") << steps("options:3 hear:2") << QStringList{details3, details2, playback} << list;
+        QTest::addRow("options without index cancel hearing") << steps("hear:2 options:") << QStringList{details2} << message;
+        QTest::addRow("hear with a bad index changes nothing") << steps("options:3 hear:two") << QStringList{details3} << message;
+        QTest::addRow("a negative index asks nothing") << steps("hear:-1") << QStringList() << message;
+        // clang-format on
     }
 
     void openOrHear()

@@ -4,6 +4,8 @@
 
 #include "testsupport.h"
 
+#include <mavrosk/phonesource.h>
+
 #include <brisken/popuputils.h>
 #include <brisken/viewcontroller.h>
 #include <quorvel/guardedpropertychangetransition.h>
@@ -25,26 +27,6 @@ using TestSupport::journalValues;
 using TestSupport::processUntilIdle;
 
 namespace {
-
-class Source : public QObject
-{
-    Q_OBJECT
-    Q_PROPERTY(int status READ status WRITE setStatus NOTIFY statusChanged)
-public:
-    int status() const { return m_status; }
-    void setStatus(int status)
-    {
-        if (status == m_status)
-            return;
-        m_status = status;
-        emit statusChanged(status);
-    }
-signals:
-    void statusChanged(int status);
-
-private:
-    int m_status = 0;
-};
 
 QString id(const char *name)
 {
@@ -217,52 +199,49 @@ private slots:
         QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("Layer")}));
     }
 
-    void autoDismiss()
+    // Popups closed for the module: after the auto-dismiss interval, with a registered
+    // dismissing popup, or left by a module transition for another popup (no longer requested).
+    void popupClosing_data()
     {
+        QTest::addColumn<QString>("closing");
+        QTest::addColumn<QStringList>("shown");
+        QTest::addRow("auto-dismiss") << "auto" << ids({QStringLiteral("B")});
+        QTest::addRow("dismissing popup") << "dismissing" << QStringList();
+        QTest::addRow("left by a transition") << "transition" << ids({QStringLiteral("A")});
+    }
+    void popupClosing()
+    {
+        QFETCH(QString, closing);
+        QFETCH(QStringList, shown);
         Screens screens;
-        screens.globalA->setAutoDismissTimeoutActive(true);
+        ViewController *controller = ViewController::instance();
+        screens.globalA->setAutoDismissTimeoutActive(closing == QLatin1String("auto"));
         screens.globalA->setAutoDismissTimeoutInterval(20);
+        if (closing == QLatin1String("dismissing"))
+            screens.globalA->registerDismissingPopup(screens.globalB);
+        (new HmiTransition(QStringLiteral("Accept"), screens.globalB))
+                ->setTargetState(screens.globalHigh);
         screens.start();
-        ViewController::instance()->requestPopup(id("B"));
-        ViewController::instance()->requestPopup(id("A"));
+        const bool autoDismiss = closing == QLatin1String("auto");
+        controller->requestPopup(id(autoDismiss ? "B" : "A"));
+        controller->requestPopup(id(autoDismiss ? "A" : "B"));
         processUntilIdle();
-        QVERIFY(screens.globalA->isActive());
-        QTRY_VERIFY(!screens.globalA->isActive());
+        if (autoDismiss) {
+            QVERIFY(screens.globalA->isActive());
+            QTRY_VERIFY(!screens.globalA->isActive());
+            processUntilIdle();
+            QCOMPARE(journalValues(QStringLiteral("popup-hidden")), ids({QStringLiteral("A")}));
+        } else if (closing == QLatin1String("dismissing")) {
+            controller->dismissPopup(id("B"));
+        } else {
+            screens.machine->postEvent(new HmiEvent(QStringLiteral("Accept")));
+            processUntilIdle();
+            QCOMPARE(screens.machine->popupStack(id("A")),
+                     ids({QStringLiteral("A"), QStringLiteral("High")}));
+            controller->dismissPopup(id("High"));
+        }
         processUntilIdle();
-        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("B")}));
-        QCOMPARE(journalValues(QStringLiteral("popup-hidden")), ids({QStringLiteral("A")}));
-    }
-
-    void dismissingPopup()
-    {
-        Screens screens;
-        screens.globalA->registerDismissingPopup(screens.globalB);
-        screens.start();
-        ViewController::instance()->requestPopup(id("A"));
-        ViewController::instance()->requestPopup(id("B"));
-        processUntilIdle();
-        ViewController::instance()->dismissPopup(id("B"));
-        processUntilIdle();
-        QCOMPARE(ViewController::instance()->shownPopups(), QStringList());
-    }
-
-    // A popup left by a module transition for another popup is no longer requested.
-    void popupLeftByTransition()
-    {
-        Screens screens;
-        auto *accept = new HmiTransition(QStringLiteral("Accept"), screens.globalB);
-        accept->setTargetState(screens.globalHigh);
-        screens.start();
-        ViewController::instance()->requestPopup(id("A"));
-        ViewController::instance()->requestPopup(id("B"));
-        processUntilIdle();
-        screens.machine->postEvent(new HmiEvent(QStringLiteral("Accept")));
-        processUntilIdle();
-        QCOMPARE(screens.machine->popupStack(id("A")),
-                 ids({QStringLiteral("A"), QStringLiteral("High")}));
-        ViewController::instance()->dismissPopup(id("High"));
-        processUntilIdle();
-        QCOMPARE(ViewController::instance()->shownPopups(), ids({QStringLiteral("A")}));
+        QCOMPARE(controller->shownPopups(), shown);
     }
 
     // Requests and dismissals made by the transitions of one notification take effect after all
@@ -272,13 +251,11 @@ private slots:
         QTest::addColumn<QString>("first");
         QTest::addColumn<QString>("second");
         QTest::addColumn<QStringList>("shown");
-        QTest::addRow("request, then a transition closing the set")
-                << "+A"
-                << "close" << ids({QStringLiteral("A")});
-        QTest::addRow("dismiss, then request") << "-A"
-                                               << "+A" << ids({QStringLiteral("A")});
-        QTest::addRow("request, then dismiss") << "+A"
-                                               << "-A" << ids({QStringLiteral("B")});
+        // clang-format off
+        QTest::addRow("request, then a transition closing the set") << "+A" << "close" << ids({QStringLiteral("A")});
+        QTest::addRow("dismiss, then request") << "-A" << "+A" << ids({QStringLiteral("A")});
+        QTest::addRow("request, then dismiss") << "+A" << "-A" << ids({QStringLiteral("B")});
+        // clang-format on
     }
     void requestsDuringOneNotification()
     {
@@ -286,16 +263,17 @@ private slots:
         QFETCH(QString, second);
         QFETCH(QStringList, shown);
         Screens screens;
-        Source source;
+        Mavrosk::PhoneSource *source = Mavrosk::PhoneSource::instance();
+        source->setStatus(0);
         StateMachine::RootHierarchyTransitions adopted;
         for (const QString &action : {first, second}) {
             QAbstractTransition *t = nullptr;
             if (action == QLatin1String("close")) {
-                t = new GuardedSignalTransition(&source, &Source::statusChanged);
+                t = new GuardedSignalTransition(source, &Mavrosk::PhoneSource::statusChanged);
                 Brisken::PopupUtils::makeExclusive(
                         t, QList<PopupState *>{screens.globalA, screens.globalB});
             } else {
-                t = new GuardedPropertyChangeTransition(&source, "status", {}, 3);
+                t = new GuardedPropertyChangeTransition(source, "status", {}, 3);
                 QObject::connect(t, &QAbstractTransition::triggered, [action] {
                     if (action.startsWith(QLatin1Char('+')))
                         ViewController::instance()->requestPopup(id("A"));
@@ -308,7 +286,7 @@ private slots:
         screens.start(adopted);
         ViewController::instance()->requestPopup(id("B"));
         processUntilIdle();
-        source.setStatus(3);
+        source->setStatus(3);
         processUntilIdle();
         QCOMPARE(ViewController::instance()->shownPopups(), shown);
     }
@@ -317,12 +295,11 @@ private slots:
     {
         QTest::addColumn<QString>("request");
         QTest::addColumn<QString>("activeView");
-        QTest::addRow("state name: the component chooses") << "PhoneRoot"
-                                                           << "Menu";
-        QTest::addRow("view identifier") << "T.Keypad"
-                                         << "Keypad";
-        QTest::addRow("unknown: recorded only") << "T.Nowhere"
-                                                << "Home";
+        // clang-format off
+        QTest::addRow("state name: the component chooses") << "PhoneRoot" << "Menu";
+        QTest::addRow("view identifier") << "T.Keypad" << "Keypad";
+        QTest::addRow("unknown: recorded only") << "T.Nowhere" << "Home";
+        // clang-format on
     }
     void showView()
     {
