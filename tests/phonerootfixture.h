@@ -53,24 +53,17 @@ inline void enter(QAbstractState *state)
     TestSupport::processUntilIdle();
 }
 
-// What the HMI was asked for since `since`: bridge commands (without the setters of other
-// screens), popups, back steps, posted events and intents, as "kind value".
+// What the HMI was asked for since `since`, in order: bridge commands (without the setters of
+// other screens), popups requested, back steps, posted events and intents.
 inline QStringList outputs(qint64 since)
 {
     QStringList result;
-    for (const QString &command : ScreenFixture::bridgeCommandsSince(since)) {
-        if (!command.section(QLatin1Char('.'), 1).startsWith(QLatin1String("set")))
-            result.append(command);
-    }
-    const QList<QPair<QString, QString>> kinds{
-            {QStringLiteral("popup-request"), QStringLiteral("id")},
-            {QStringLiteral("back"), QStringLiteral("steps")},
-            {QStringLiteral("event"), QStringLiteral("name")},
-            {QStringLiteral("intent"), QStringLiteral("action")},
-    };
-    for (const auto &kind : kinds) {
-        for (const QString &value : TestSupport::journalValues(kind.first, kind.second, since))
-            result.append(kind.first.section(QLatin1Char('-'), 0, 0) + QLatin1Char(' ') + value);
+    const QStringList kinds{QStringLiteral("bridge"), QStringLiteral("popup-request"),
+                            QStringLiteral("back"), QStringLiteral("event"),
+                            QStringLiteral("intent")};
+    for (const QString &line : TestSupport::journalLines(since, kinds)) {
+        if (!line.section(QLatin1Char('.'), 1).startsWith(QLatin1String("set")))
+            result.append(line);
     }
     return result;
 }

@@ -1,10 +1,12 @@
 #pragma once
 
 // Helpers shared by the test suites: run the event loop until the state machine is idle, read the
-// platform journal, and fail on framework warnings that a test did not expect.
+// platform journal, post events, and fail on framework warnings that a test did not expect.
 
 #include <host/modulehost.h>
 #include <journal/journal.h>
+#include <quorvel/hmievent.h>
+#include <quorvel/statemachine.h>
 
 #include <QCoreApplication>
 #include <QStringList>
@@ -18,6 +20,26 @@ inline void processUntilIdle()
     Host::processUntilIdle();
 }
 
+inline qint64 mark()
+{
+    return Platform::Journal::instance()->lastSequence();
+}
+
+inline void post(const QString &name, const QVariant &value = QVariant())
+{
+    Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(name, value));
+    processUntilIdle();
+}
+
+inline QStringList activeStates()
+{
+    QStringList names;
+    const auto configuration = Quorvel::StateMachine::instance()->configuration();
+    for (const QAbstractState *state : configuration)
+        names.append(state->objectName());
+    return names;
+}
+
 // The journal entries of one kind since a sequence number, as the value of one field
 // (for example the ids of the popups requested).
 inline QStringList journalValues(const QString &kind, const QString &field = QStringLiteral("id"),
@@ -29,6 +51,41 @@ inline QStringList journalValues(const QString &kind, const QString &field = QSt
             values.append(entry.fields.value(field).toString());
     }
     return values;
+}
+
+// The journal since `since` in order, one line per entry of the `kinds` given (all when empty):
+// bridge commands as "phone.dialNumber(555)", intents as "intent 20(a,b)", the others as
+// "kind name-or-id-or-steps", e.g. "event HmiPhone_RoamingMode", "popup-request PHONE.Redial".
+inline QStringList journalLines(qint64 since, const QStringList &kinds = {})
+{
+    QStringList lines;
+    for (const Platform::JournalEntry &entry : Platform::Journal::instance()->entriesSince(since)) {
+        if (!kinds.isEmpty() && !kinds.contains(entry.kind))
+            continue;
+        const QVariantMap &f = entry.fields;
+        QStringList args;
+        for (const QVariant &arg : f.value(QStringLiteral("args")).toList())
+            args.append(arg.toString());
+        const QString argList = QLatin1Char('(') + args.join(QLatin1Char(',')) + QLatin1Char(')');
+        if (entry.kind == QLatin1String("bridge"))
+            lines.append(f.value(QStringLiteral("call")).toString() + argList);
+        else if (entry.kind == QLatin1String("intent"))
+            lines.append(QStringLiteral("intent ") + f.value(QStringLiteral("action")).toString()
+                         + argList);
+        else
+            for (const char *field : {"name", "id", "steps", "call"})
+                if (f.contains(QLatin1String(field))) {
+                    lines.append(entry.kind + QLatin1Char(' ')
+                                 + f.value(QLatin1String(field)).toString());
+                    break;
+                }
+    }
+    return lines;
+}
+
+inline QStringList bridgeCommandsSince(qint64 since)
+{
+    return journalLines(since, {QStringLiteral("bridge")});
 }
 
 // Records the warnings of Qt's state machine and fails the running test in cleanup() unless the
@@ -55,13 +112,15 @@ private:
     }
     static void handle(QtMsgType type, const QMessageLogContext &context, const QString &message)
     {
-        if (type == QtWarningMsg
-            && (message.contains(QLatin1String("QStateMachine"))
-                || message.contains(QLatin1String("QState::"))
-                || message.contains(QLatin1String("QSignalTransition"))
-                || message.contains(QLatin1String("No such signal"))
-                || message.contains(QLatin1String("Missing initial state"))))
-            warnings().append(message);
+        static const char *const watched[]
+                = {"QStateMachine", "QState::", "QSignalTransition", "No such signal",
+                   "Missing initial state"};
+        if (type == QtWarningMsg)
+            for (const char *text : watched)
+                if (message.contains(QLatin1String(text))) {
+                    warnings().append(message);
+                    break;
+                }
         if (s_previous)
             s_previous(type, context, message);
     }

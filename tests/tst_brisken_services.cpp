@@ -42,19 +42,6 @@ StatusBarController *sharedStatusBar()
     return DataStore::get<StatusBarController>(QStringLiteral("StatusBarController"));
 }
 
-// The journal since `since`, as "kind:name-or-id" lines.
-QStringList outputs(qint64 since)
-{
-    QStringList lines;
-    for (const Platform::JournalEntry &entry : Journal::instance()->entriesSince(since)) {
-        const QVariant what = entry.fields.contains(QStringLiteral("name"))
-                ? entry.fields.value(QStringLiteral("name"))
-                : entry.fields.value(QStringLiteral("id"));
-        lines.append(entry.kind + QLatin1Char(':') + what.toString());
-    }
-    return lines;
-}
-
 // A running machine with one screen, two global popups and a source-less transition on "Fire".
 struct Machine
 {
@@ -97,14 +84,10 @@ private slots:
     void viewIdentifier();
     void dataStore();
     void statusBar();
-    void transientRequests_data();
-    void transientRequests();
+    void requestObjects();
     void actionEnabledBinding();
     void moduleControllerPostsLater_data();
     void moduleControllerPostsLater();
-    void moduleControllerViewController();
-    void popupAndViewRequests_data();
-    void popupAndViewRequests();
     void makeExclusiveClosesPopups();
 };
 
@@ -158,48 +141,58 @@ void TestBriskenServices::statusBar()
     bar->requestTransientWidget(QStringLiteral("First"), 0);
     bar->requestTransientWidget(QStringLiteral("Second"), 3);
     bar->hideTransientWidget(QStringLiteral("First"));
-    QCOMPARE(outputs(since),
-             (QStringList{QStringLiteral("transient:First"), QStringLiteral("transient:Second"),
-                          QStringLiteral("transient-hide:First")}));
+    QCOMPARE(TestSupport::journalLines(since),
+             (QStringList{QStringLiteral("transient First"), QStringLiteral("transient Second"),
+                          QStringLiteral("transient-hide First")}));
     QCOMPARE(
             TestSupport::journalValues(QStringLiteral("transient"), QStringLiteral("value"), since),
             (QStringList{QStringLiteral("0"), QStringLiteral("3")}));
     QCOMPARE(bar->transientWidgets(), QStringList{QStringLiteral("Second")});
 }
 
-void TestBriskenServices::transientRequests_data()
+// Built once, each request object runs each time its signal fires, in the order connected.
+void TestBriskenServices::requestObjects()
 {
-    QTest::addColumn<bool>("barVisible");
-    QTest::addColumn<bool>("siriActive");
-    QTest::addColumn<QStringList>("shown");
-    const QStringList transient{QStringLiteral("transient:Activated")};
-    QTest::addRow("bar visible, condition met") << true << true << (transient + transient);
-    QTest::addRow("bar visible, condition not met") << true << false << transient;
-}
-
-void TestBriskenServices::transientRequests()
-{
-    QFETCH(bool, barVisible);
-    QFETCH(bool, siriActive);
-    QFETCH(QStringList, shown);
+    Machine machine;
+    machine.start();
     StatusBarController *bar = sharedStatusBar();
-    bar->setStatusBarVisible(barVisible);
-    QObject source;
-    source.setProperty("siriActive", siriActive);
+    StatusBarController hiddenBar;
+    hiddenBar.setStatusBarVisible(false);
+    QObject siri;
+    siri.setProperty("siriActive", true);
+    const QString note = QStringLiteral("Note");
+    const QString popup = QStringLiteral("T.Second");
     QObject trigger;
-    const QString transient = QStringLiteral("Activated");
-    const QString popup = QStringLiteral("PHONE.ActivatedPopup");
-    QObject::connect(&trigger, &QObject::objectNameChanged,
-                     Brisken::ShowTransientOrPopupRequest(bar, transient, popup));
-    QObject::connect(&trigger, &QObject::objectNameChanged,
-                     Brisken::ConditionalShowTransientOrPopupRequest(bar, transient, popup, &source,
-                                                                     "siriActive", true));
-    const qint64 since = Journal::instance()->lastSequence();
+    auto add = [&trigger](auto request) {
+        QObject::connect(&trigger, &QObject::objectNameChanged, request);
+    };
+    add(Brisken::RequestPopup(machine.first, QVariant()));
+    add(Brisken::DismissPopup(QStringLiteral("T.First")));
+    add(Brisken::RequestView(Quorvel::NamedState::stateForName(QStringLiteral("Home"))));
+    add(Brisken::ShowTransientOrPopupRequest(bar, note, popup));
+    add(Brisken::ShowTransientOrPopupRequest(&hiddenBar, note, popup));
+    add(Brisken::ShowTransientOrPopupRequest(nullptr, note, popup));
+    add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
+                                                        true));
+    add(Brisken::ConditionalShowTransientOrPopupRequest(bar, note, popup, &siri, "siriActive",
+                                                        false));
+    add(Brisken::HideTransientRequest(bar, note));
+    const qint64 since = TestSupport::mark();
 
-    trigger.setObjectName(QStringLiteral("fire"));
-    Brisken::HideTransientRequest(bar, transient)();
+    trigger.setObjectName(QStringLiteral("once"));
+    trigger.setObjectName(QStringLiteral("twice"));
 
-    QCOMPARE(outputs(since), shown << QStringLiteral("transient-hide:Activated"));
+    const QStringList once{
+            QStringLiteral("popup-request T.First"),  QStringLiteral("popup-dismiss T.First"),
+            QStringLiteral("view-request Home"),      QStringLiteral("transient Note"),
+            QStringLiteral("popup-request T.Second"), QStringLiteral("popup-request T.Second"),
+            QStringLiteral("transient Note"),         QStringLiteral("transient-hide Note")};
+    QCOMPARE(TestSupport::journalLines(since,
+                                       {QStringLiteral("popup-request"),
+                                        QStringLiteral("popup-dismiss"),
+                                        QStringLiteral("view-request"), QStringLiteral("transient"),
+                                        QStringLiteral("transient-hide")}),
+             once + once);
 }
 
 void TestBriskenServices::actionEnabledBinding()
@@ -254,84 +247,6 @@ void TestBriskenServices::moduleControllerPostsLater()
     TestSupport::processUntilIdle();
     QCOMPARE(machine.fired, 1);
     QCOMPARE(machine.fire->transitionData(), QVariant(42));
-}
-
-void TestBriskenServices::moduleControllerViewController()
-{
-    Brisken::ModuleController controller;
-    QCOMPARE(controller.viewController(), Brisken::ViewController::instance());
-    controller.setViewController(nullptr);
-    QVERIFY(!controller.viewController());
-}
-
-using RequestFactory = std::function<void(QObject *trigger, Quorvel::PopupState *popup)>;
-Q_DECLARE_METATYPE(RequestFactory)
-
-void TestBriskenServices::popupAndViewRequests_data()
-{
-    QTest::addColumn<RequestFactory>("connectRequest");
-    QTest::addColumn<QStringList>("journal");
-    const auto rows = QList<std::tuple<const char *, RequestFactory, QStringList>>{
-            {"request popup by state",
-             [](QObject *trigger, Quorvel::PopupState *popup) {
-                 QObject::connect(trigger, &QObject::objectNameChanged,
-                                  Brisken::RequestPopup(popup, QVariant()));
-             },
-             {QStringLiteral("popup-request:T.First")}},
-            {"dismiss popup by identifier",
-             [](QObject *trigger, Quorvel::PopupState *) {
-                 QObject::connect(trigger, &QObject::objectNameChanged,
-                                  Brisken::DismissPopup(QStringLiteral("T.First")));
-             },
-             {QStringLiteral("popup-dismiss:T.First")}},
-            {"view by state name",
-             [](QObject *trigger, Quorvel::PopupState *) {
-                 QObject::connect(trigger, &QObject::objectNameChanged,
-                                  Brisken::RequestView(Quorvel::NamedState::stateForName(
-                                          QStringLiteral("Home"))));
-             },
-             {QStringLiteral("view-request:Home")}},
-            {"transient or popup, status bar hidden",
-             [](QObject *trigger, Quorvel::PopupState *) {
-                 sharedStatusBar()->setStatusBarVisible(false);
-                 QObject::connect(trigger, &QObject::objectNameChanged,
-                                  Brisken::ShowTransientOrPopupRequest(sharedStatusBar(),
-                                                                       QStringLiteral("Note"),
-                                                                       QStringLiteral("T.Second")));
-             },
-             {QStringLiteral("popup-request:T.Second")}},
-            {"transient or popup, no status bar",
-             [](QObject *trigger, Quorvel::PopupState *) {
-                 QObject::connect(trigger, &QObject::objectNameChanged,
-                                  Brisken::ShowTransientOrPopupRequest(nullptr,
-                                                                       QStringLiteral("Note"),
-                                                                       QStringLiteral("T.Second")));
-             },
-             {QStringLiteral("popup-request:T.Second")}}};
-    for (const auto &row : rows)
-        QTest::newRow(std::get<0>(row)) << std::get<1>(row) << std::get<2>(row);
-}
-
-void TestBriskenServices::popupAndViewRequests()
-{
-    QFETCH(RequestFactory, connectRequest);
-    QFETCH(QStringList, journal);
-    Machine machine;
-    machine.start();
-    QObject trigger;
-    connectRequest(&trigger, machine.first);
-    const qint64 since = Journal::instance()->lastSequence();
-
-    // Built once, the request runs each time its signal fires.
-    trigger.setObjectName(QStringLiteral("once"));
-    trigger.setObjectName(QStringLiteral("twice"));
-
-    QStringList requests;
-    for (const QString &line : outputs(since)) {
-        if (line.contains(QLatin1String("request")) || line.contains(QLatin1String("dismiss")))
-            requests.append(line);
-    }
-    QCOMPARE(requests, journal + journal);
 }
 
 void TestBriskenServices::makeExclusiveClosesPopups()

@@ -75,7 +75,7 @@ void TestPhoneRoot::firstScreen()
         // status.
         const bool connected = Mavrosk::BluetoothSource::instance()->deviceConnected();
         QCOMPARE(outputs(since).contains(QStringLiteral("phone.checkPhoneStatus()")), connected);
-        QCOMPARE(outputs(since).contains(QStringLiteral("intent 70")), !connected);
+        QCOMPARE(outputs(since).contains(QStringLiteral("intent 70()")), !connected);
     }
 }
 
@@ -106,7 +106,7 @@ void TestPhoneRoot::navigation_data()
             << ""_q;
     QTest::addRow("reconnection failed during a call")
             << inCall << QStringList{"reconnect failed"_q} << "HmiPhone_Limbo"_q
-            << "intent 70"_q;
+            << "intent 70()"_q;
     QTest::addRow("notification on in the menu")
             << Connected << QStringList{notification} << "PhoneMenuViewState"_q
             << "event HmiPhone_ShowSmsRequest"_q;
@@ -161,7 +161,7 @@ void TestPhoneRoot::actions_data()
                   dnd = Events::HmiPhone_DoNotDisturbToggleRequest,
                   call = QStringLiteral("makeCall");
     const QString siriOk = Connected + "phone.siriSupported=true phone.siriEnabled=true"_q;
-    const QString refused = QStringLiteral("popup ") + Views::siriFeatureNotEnabledPopup;
+    const QString refused = QStringLiteral("popup-request ") + Views::siriFeatureNotEnabledPopup;
     const QString number = Connected + "phone.callNumberEntered=0123"_q;
     const QString dial = QStringLiteral("phone.dialNumber(0123)");
 
@@ -182,12 +182,12 @@ void TestPhoneRoot::actions_data()
             << dnd << "phone.disableDoNotDisturb()"_q;
     QTest::addRow("DND off, forbidden by the restricted key")
             << Connected + "phone.doNotDisturb=true ardel.ignitionKeyType=2"_q << dnd
-            << QStringLiteral("popup ") + Views::PhoneDndActiveArdel;
+            << QStringLiteral("popup-request ") + Views::PhoneDndActiveArdel;
     QTest::addRow("dial") << number << call << dial;
     QTest::addRow("dial roaming, warning off") << number + " phone.roaming=true"_q << call << dial;
     QTest::addRow("dial roaming, warning on")
             << number + " phone.roaming=true phone.roamingWarning=true"_q << call
-            << QStringLiteral("popup ") + Views::RoamingWarning;
+            << QStringLiteral("popup-request ") + Views::RoamingWarning;
 }
 
 void TestPhoneRoot::actions()

@@ -234,6 +234,10 @@ bool ScenarioRunner::readValue(const QString &name, QVariant *value, QString *er
             object = Brisken::DataStore::get(QStringLiteral("ViewManager"));
         } else if (member == QLatin1String("statusBarVisible")) {
             object = Brisken::DataStore::get(QStringLiteral("StatusBarController"));
+            if (!object) {
+                *error = QStringLiteral("the host runs without a status bar");
+                return false;
+            }
         } else if (member == QLatin1String("transients")) {
             auto *statusBar = Brisken::DataStore::get<Brisken::StatusBarController>(
                     QStringLiteral("StatusBarController"));
@@ -371,14 +375,13 @@ void ScenarioRunner::check(const ScenarioStep &step, bool negated)
     }
     for (auto it = checks.constBegin(); it != checks.constEnd(); ++it) {
         ++m_checks;
-        const QString message = checkOne(it.key(), it.value(), checks, negated);
+        const QString message = checkOne(it.key(), it.value(), negated);
         if (!message.isEmpty())
             fail(step.line, message);
     }
 }
 
-QString ScenarioRunner::checkOne(const QString &key, const QJsonValue &expected,
-                                 const QJsonObject &, bool negated) const
+QString ScenarioRunner::checkOne(const QString &key, const QJsonValue &expected, bool negated) const
 {
     const QString wanted = expected.toString();
     const QString no = negated ? QStringLiteral("no ") : QString();

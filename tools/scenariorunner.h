@@ -63,8 +63,7 @@ private:
     bool readValue(const QString &name, QVariant *value, QString *error) const;
     bool writeValue(const QString &name, const QVariant &value, QString *error);
 
-    QString checkOne(const QString &key, const QJsonValue &expected, const QJsonObject &all,
-                     bool negated) const;
+    QString checkOne(const QString &key, const QJsonValue &expected, bool negated) const;
     QString checkOutput(const QJsonObject &expected, bool negated) const;
 
     Host::ModuleHost *m_host;
