@@ -334,8 +334,9 @@ private slots:
             QStringLiteral("Home"));
         row("back to the menu lets the root choose again", QStringLiteral("Menu Keypad"), true, 1,
             QStringLiteral("CallView"), QStringLiteral("Home CallView"));
-        row("in-call keypad back to the call view", QStringLiteral("CallView InCallKeypad"), true,
-            1, QStringLiteral("CallView"), QStringLiteral("Home CallView"));
+        row("in-call keypad back where the call view goes",
+            QStringLiteral("Menu CallView InCallKeypad"), false, 1, QStringLiteral("Menu"),
+            QStringLiteral("Home Menu"));
         row("call view entry is unique", QStringLiteral("CallView Menu CallView"), false, 1,
             QStringLiteral("Menu"), QStringLiteral("Home Menu"));
         row("contacts list straight to the phone root", QStringLiteral("Menu BookSearch BookList"),

@@ -17,7 +17,9 @@ class HmiTargetFilter;
 // entered that has a back-stack presence is pushed on the back stack; going back n steps pops
 // entries and enters the one reached. The settings:
 //   setHasBackStackPresence(false)   the view is never pushed;
-//   setBackTargetProviderState(s)    back from this view (when it is not on the stack) goes to s;
+//   setBackTargetProviderState(s)    back from this view (when it is not on the stack) goes
+//                                    where back from the view state s would go (to s itself
+//                                    when s is no view state);
 //   createDirectBackTransition(s)    back from this view goes straight to s;
 //   setBackStackStateId(id, unique)  going back to this view enters the state named id instead
 //                                    (so a component can choose its screen again); when unique

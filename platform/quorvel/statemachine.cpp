@@ -457,11 +457,22 @@ bool StateMachinePrivate::back(int steps)
 
     QAbstractState *target = nullptr;
     int remaining = steps;
-    if (current && current->directBackTarget()) {
+    // A view without a back-stack presence whose back target comes from a provider view goes
+    // back as that view would (its entry, direct back target and filters); a provider that is
+    // no view state is the target itself.
+    if (current && !current->directBackTarget() && !current->hasBackStackPresence()
+        && current->backTargetProviderState()) {
+        if (auto *provider = qobject_cast<HmiViewState *>(current->backTargetProviderState())) {
+            current = provider;
+            if (!stack.isEmpty() && stack.last() == current)
+                stack.removeLast();
+        } else {
+            target = current->backTargetProviderState();
+            --remaining;
+        }
+    }
+    if (!target && current && current->directBackTarget()) {
         target = current->directBackTarget();
-        --remaining;
-    } else if (current && !current->hasBackStackPresence() && current->backTargetProviderState()) {
-        target = current->backTargetProviderState();
         --remaining;
     }
     while (remaining > 0 && !stack.isEmpty()) {

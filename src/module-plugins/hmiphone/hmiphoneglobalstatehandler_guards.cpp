@@ -80,14 +80,18 @@ void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
 {
     if (!m_callConnectedTransition)
         return;
-    const bool callOngoing = m_phoneSource->callConnected() || m_phoneSource->dialingInProgress();
-    const int context = m_viewManager ? m_viewManager->displayContext() : 0;
-    if (context == 5)
-        m_callConnectedTransition->setAllowTransition(!m_navSource->routeActive() && callOngoing);
-    else if (context == 1)
+    // The display context is asked first, and again for the second test; with a route active in
+    // context 5 the call screens stay closed whatever the call does.
+    const auto context = [this] { return m_viewManager ? m_viewManager->displayContext() : 0; };
+    const auto callOngoing = [this] {
+        return m_phoneSource->callConnected() || m_phoneSource->dialingInProgress();
+    };
+    if (context() == 5)
+        m_callConnectedTransition->setAllowTransition(!m_navSource->routeActive() && callOngoing());
+    else if (context() == 1)
         m_callConnectedTransition->setAllowTransition(false);
     else
-        m_callConnectedTransition->setAllowTransition(callOngoing);
+        m_callConnectedTransition->setAllowTransition(callOngoing());
 }
 
 void HmiPhoneGlobalStateHandler::redialKeyTransitionEventTest(QEvent *)

@@ -24,7 +24,8 @@ constexpr int DownloadRunning = 2;
 constexpr int DownloadFinished = 3;
 constexpr int DownloadFailed = 4;
 
-// Retries the user may make from the download-failed popup before the final popup is shown.
+// Retries the user may make from the download-failed popup before the final popup is shown;
+// they are counted for the manager's whole life.
 constexpr int MaxDownloadRetries = 2;
 
 } // namespace
@@ -43,12 +44,6 @@ HmiPhoneSmsManager::HmiPhoneSmsManager(HmiPhoneController *controller, QObject *
             &HmiPhoneSmsManager::onSmsInboxChanged);
     connect(Mavrosk::BluetoothSource::instance(), &Mavrosk::BluetoothSource::phoneDeviceChanged,
             this, &HmiPhoneSmsManager::onSmsInboxChanged);
-    // A finished download closes the retry episode: the next failure starts a new one.
-    connect(m_phoneSource, &Mavrosk::PhoneSource::messagesDownloadingStatusChanged, this,
-            [this](int status) {
-                if (status == DownloadFinished)
-                    m_retryCount = 0;
-            });
 }
 
 void HmiPhoneSmsManager::createSmsStates(Phone_Cmp *phone)
@@ -138,12 +133,10 @@ void HmiPhoneSmsManager::handlePhnSmsRequestInbox()
 {
     if (!m_inboxChanged)
         return;
-    // While a download runs the request is put off, not dropped: the change stays pending so
-    // that the next request after the download fetches it.
-    if (m_phoneSource->messagesDownloadingStatus() == DownloadRunning)
-        return;
+    // A running download brings the inbox with it: the change counts as handled either way.
+    if (m_phoneSource->messagesDownloadingStatus() != DownloadRunning)
+        m_phoneSource->requestTextMessagesInbox();
     m_inboxChanged = false;
-    m_phoneSource->requestTextMessagesInbox();
 }
 
 void HmiPhoneSmsManager::smsHandlePhoneDeclinedAccess()
