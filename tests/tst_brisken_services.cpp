@@ -218,6 +218,9 @@ private slots:
     void moduleControllerPostsLater()
     {
         QFETCH(bool, startFirst);
+        // Held for a machine destroyed before it started: never reaches the next one.
+        Brisken::ModuleController().postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 7));
+        Quorvel::StateMachine::destroyInstance();
         Machine machine;
         if (startFirst)
             machine.start();

@@ -24,10 +24,15 @@ struct PendingEvents
 
     void hold(Quorvel::StateMachine *machine, QEvent *event)
     {
+        const bool newMachine = watched != machine;
+        if (newMachine) {
+            // Those held so far were for a machine that is gone without starting.
+            events.clear();
+            watched = machine;
+        }
         events.emplace_back(event);
-        if (watched == machine)
+        if (!newMachine)
             return;
-        watched = machine;
         QObject::connect(machine, &QStateMachine::started, machine, [this, machine] {
             std::vector<std::unique_ptr<QEvent>> held;
             held.swap(events);

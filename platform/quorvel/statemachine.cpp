@@ -185,6 +185,8 @@ void StateMachinePrivate::build()
     levels[2]->setInitialState(layers);
     q->setInitialState(levels[0]);
     router = new RouterTransition(q);
+    adoptedHolder = new QState(q);
+    adoptedHolder->setObjectName(QStringLiteral("AdoptedTransitions"));
 }
 
 PopupRegion *StateMachinePrivate::createPopupRegion(const QString &name, QState *parent)
@@ -322,14 +324,19 @@ void StateMachinePrivate::beginSelect(QEvent *event)
         if (!transition)
             return;
         transition->m_data = fire->data;
-        // An adopted transition with a target leaves only what lies below the deepest active
-        // proper ancestor of its target: it fires from there as an internal transition.
-        if (transition->m_adopted && transition->targetState()) {
-            if (QState *domain = domainFor(transition->targetState())) {
+        parkMovedTransition();
+        // An adopted transition fires from its level; one with a target leaves only what lies
+        // below the deepest active proper ancestor of its target: it fires from there as an
+        // internal transition.
+        if (transition->m_adopted) {
+            QState *domain
+                    = transition->targetState() ? domainFor(transition->targetState()) : nullptr;
+            if (domain)
                 transition->setTransitionType(QAbstractTransition::InternalTransition);
-                domain->addTransition(transition);
-                movedTransition = transition;
-            }
+            else
+                domain = levels[transition->m_level - 1];
+            domain->addTransition(transition);
+            movedTransition = transition;
         }
         return;
     }
@@ -372,10 +379,7 @@ void StateMachinePrivate::beginSelect(QEvent *event)
 void StateMachinePrivate::endMicrostep(QEvent *)
 {
     inMicrostep = false;
-    if (HmiAbstractTransition *transition = movedTransition) {
-        movedTransition = nullptr;
-        levels[transition->m_level - 1]->addTransition(transition);
-    }
+    parkMovedTransition();
     auto *routerTransition = static_cast<RouterTransition *>(router);
     if (routerTransition->armed) {
         routerTransition->armed = nullptr;
@@ -387,6 +391,14 @@ void StateMachinePrivate::endMicrostep(QEvent *)
         microstepOps.clear();
         for (const PopupOp &op : ops)
             perform(op);
+    }
+}
+
+void StateMachinePrivate::parkMovedTransition()
+{
+    if (HmiAbstractTransition *transition = movedTransition) {
+        movedTransition = nullptr;
+        adoptedHolder->addTransition(transition);
     }
 }
 
@@ -715,8 +727,10 @@ void StateMachine::installRootHierarchy(const RootHierarchyTransitions &transiti
         if (auto *hmiTransition = qobject_cast<HmiAbstractTransition *>(transition)) {
             hmiTransition->m_adopted = true;
             hmiTransition->m_level = levelState(entry.first) ? entry.first : StateLevel3;
+            d->adoptedHolder->addTransition(transition);
+        } else {
+            level->addTransition(transition);
         }
-        level->addTransition(transition);
     }
 }
 

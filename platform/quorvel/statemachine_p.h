@@ -146,7 +146,12 @@ public:
     bool inMicrostep = false;
 
     QAbstractTransition *router = nullptr;
+    // Adopted framework transitions wait on this never-active state, so that the machine does
+    // not look at them for other notifications; each is moved to its level (or to its target's
+    // domain) for its own turn only.
+    QState *adoptedHolder = nullptr;
     QPointer<HmiAbstractTransition> movedTransition;
+    void parkMovedTransition();
 };
 
 } // namespace Quorvel
