@@ -427,19 +427,6 @@ private slots:
         QCOMPARE(spy.first().first().toInt(), stored);
     }
 
-    void receivedTextMessageCount()
-    {
-        QSignalSpy spy(m_controller.get(), &HmiPhoneController::receivedTextMessageCountChanged);
-        m_controller->resetRecievedTextMessageCount();
-        QCOMPARE(spy.count(), 0);
-        m_controller->incrementRecievedTextMessageCount();
-        m_controller->incrementRecievedTextMessageCount();
-        m_controller->resetRecievedTextMessageCount();
-        QCOMPARE(spy.count(), 3);
-        QCOMPARE(spy.at(1).first().toInt(), 2);
-        QCOMPARE(spy.at(2).first().toInt(), 0);
-    }
-
     void windowForVisibleRows_data()
     {
         QTest::addColumn<int>("top");

@@ -109,27 +109,10 @@ private slots:
         }
     }
 
-    void firstScreen_data()
+    // Opened through the host's menu bar with a phone connected, the phone shows its menu; the
+    // menu's entry and exit reach QML through the controller's signals.
+    void phoneMenu()
     {
-        QTest::addColumn<bool>("connected");
-        QTest::addColumn<int>("status");
-        QTest::addColumn<int>("emergency");
-        QTest::addColumn<QString>("expected");
-
-        QTest::addRow("no phone") << false << 0 << 0 << QStringLiteral("HmiPhone_Limbo");
-        QTest::addRow("call") << true << 4 << 0 << QStringLiteral("CallInProgressViewState");
-        QTest::addRow("emergency") << true << 0 << 1 << QStringLiteral("PhoneEmgcyAsst");
-        QTest::addRow("phone menu") << true << 0 << 0 << QStringLiteral("PhoneMenuViewState");
-    }
-
-    void firstScreen()
-    {
-        QFETCH(bool, connected);
-        QFETCH(int, status);
-        QFETCH(int, emergency);
-        QFETCH(QString, expected);
-
-        // The phone menu's entry and exit reach QML through the controller's signals.
         QObject *controller = m_engine->rootContext()
                                       ->contextProperty(QStringLiteral("_hmiphoneController"))
                                       .value<QObject *>();
@@ -137,22 +120,14 @@ private slots:
         QSignalSpy entered(controller, SIGNAL(phoneMenuEntered()));
         QSignalSpy exited(controller, SIGNAL(phoneMenuExited()));
 
-        Mavrosk::BluetoothSource::instance()->setDeviceConnected(connected);
-        Mavrosk::PhoneSource::instance()->setStatus(status);
-        Mavrosk::PhoneSource::instance()->setEmergencyCallStatus(emergency);
+        Mavrosk::BluetoothSource::instance()->setDeviceConnected(true);
         m_host->openModule();
         TestSupport::processUntilIdle();
-
-        QStringList active;
-        for (const QAbstractState *state : Quorvel::StateMachine::instance()->configuration())
-            active.append(state->objectName());
-        QVERIFY2(active.contains(expected), qPrintable(active.join(QLatin1Char(' '))));
-
-        const int menuEntries = expected == QLatin1String("PhoneMenuViewState") ? 1 : 0;
-        QCOMPARE(entered.count(), menuEntries);
+        QVERIFY(TestSupport::activeStates().contains(QStringLiteral("PhoneMenuViewState")));
+        QCOMPARE(entered.count(), 1);
         m_host->openHome();
         TestSupport::processUntilIdle();
-        QCOMPARE(exited.count(), menuEntries);
+        QCOMPARE(exited.count(), 1);
     }
 
 private:

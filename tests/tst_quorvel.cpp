@@ -185,19 +185,6 @@ private slots:
         QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-hidden")), QStringList());
     }
 
-    void listedTransitionKeepsItsSource()
-    {
-        Tree tree;
-        auto *fromMenu = new HmiTransition(QStringLiteral("Go"), tree.menu);
-        fromMenu->setTargetState(tree.contacts);
-        tree.start({{StateLevel3, fromMenu}});
-        tree.post(QStringLiteral("Go"));
-        QVERIFY(tree.home->isActive());
-        tree.goTo(tree.phone);
-        tree.post(QStringLiteral("Go"));
-        QVERIFY(tree.contactsList->isActive());
-    }
-
     // One notification fires every transition it enables, guards asked first in creation order,
     // then the enabled ones in that order; one whose source was left meanwhile is dropped.
     void fanOut_data()
@@ -261,33 +248,6 @@ private slots:
                  (QStringList{QStringLiteral("A?"), QStringLiteral("B?"), QStringLiteral("D?"),
                               QStringLiteral("A"), QStringLiteral("C"), QStringLiteral("E")}));
         QVERIFY(tree.contactsList->isActive());
-    }
-
-    void complementaryGuards_data()
-    {
-        QTest::addColumn<bool>("condition");
-        QTest::addColumn<QStringList>("fired");
-        QTest::addRow("condition holds") << true << QStringList{QStringLiteral("allowed")};
-        QTest::addRow("condition fails") << false << QStringList{QStringLiteral("refused")};
-    }
-    void complementaryGuards()
-    {
-        QFETCH(bool, condition);
-        QFETCH(QStringList, fired);
-        Tree tree;
-        QStringList trace;
-        for (bool wanted : {true, false}) {
-            auto *t = new HmiTransition(QStringLiteral("Siri"), tree.phone);
-            QObject::connect(t, &GuardedTransition::transitionTest, t,
-                             [&, t, wanted] { t->setAllowTransition(condition == wanted); });
-            QObject::connect(t, &QAbstractTransition::triggered, t, [&trace, wanted] {
-                trace << QString::fromLatin1(wanted ? "allowed" : "refused");
-            });
-        }
-        tree.start();
-        tree.goTo(tree.phone);
-        tree.post(QStringLiteral("Siri"));
-        QCOMPARE(trace, fired);
     }
 
     // The trigger of each kind, the guard's default and the transition data.
@@ -394,17 +354,6 @@ private slots:
         }
         QCOMPARE(count, fires);
         QCOMPARE(lastData, data);
-    }
-
-    void layeredState()
-    {
-        Tree tree;
-        auto *layerPopup = new PopupState(QStringLiteral("T.Layer"), tree.phone, 1);
-        tree.start();
-        QCOMPARE(tree.menu->parentState(), tree.phone->exclusiveState());
-        QCOMPARE(layerPopup->parentState(), tree.phone->layerState());
-        QCOMPARE(tree.phone->initialHmiState(), tree.choose);
-        QCOMPARE(tree.phone->childMode(), QState::ParallelStates);
     }
 
     void conditionalState_data()

@@ -1,4 +1,4 @@
-// The module framework: module identity, intents and their request objects, hosted submodules,
+// The module framework: intents and their request objects, hosted submodules,
 // hard-key fall-backs and logging categories.
 
 #include "testsupport.h"
@@ -9,7 +9,6 @@
 #include <taldris/hmiintenthandler.h>
 #include <taldris/hmiintentmanager.h>
 #include <taldris/hmiintentrequest.h>
-#include <taldris/hmimoduleintegration.h>
 #include <taldris/hmisubmoduleprovider.h>
 #include <taldris/intentactionrequest.h>
 #include <taldris/pellumcategory.h>
@@ -49,14 +48,6 @@ public:
     QVariantList intentArguments() const override { return {QStringLiteral("from provider")}; }
 };
 
-class Integration : public Taldris::HmiModuleIntegration
-{
-public:
-    using Taldris::HmiModuleIntegration::HmiModuleIntegration;
-    QString moduleName() const override { return QStringLiteral("Test"); }
-    Quorvel::HmiState *createScreenStateSubTree(Quorvel::HmiState *) override { return nullptr; }
-};
-
 class Submodule : public Taldris::HmiHostedSubmodule
 {
 public:
@@ -82,26 +73,6 @@ class TestTaldris : public QObject
 {
     Q_OBJECT
 private slots:
-    void moduleIdentity_data()
-    {
-        QTest::addColumn<int>("type");
-        QTest::addColumn<QString>("root");
-        QTest::addRow("type 1") << 1 << QStringLiteral("PHONE.Root");
-        QTest::addRow("unknown type") << 77 << QStringLiteral(".Root");
-    }
-
-    void moduleIdentity()
-    {
-        QFETCH(int, type);
-        QFETCH(QString, root);
-        Integration integration(type);
-        QCOMPARE(integration.moduleType(), type);
-        QCOMPARE(integration.moduleId(), root.section(QLatin1Char('.'), 0, 0));
-        QCOMPARE(integration.rootStateIdentifier(), root);
-        QVERIFY(integration.moduleRootHierarchyTransitions().isEmpty());
-        QVERIFY(integration.moduleRootHierarchyPopupStates().isEmpty());
-    }
-
     void requestAction_data()
     {
         QTest::addColumn<int>("action");

@@ -111,6 +111,11 @@ struct Screens
     bool inCall = false;
 };
 
+QStringList words(const char *text)
+{
+    return QString::fromLatin1(text).split(QLatin1Char(' '), Qt::SkipEmptyParts);
+}
+
 QStringList ids(const QStringList &names)
 {
     QStringList result;
@@ -137,28 +142,21 @@ private slots:
         QTest::addColumn<QStringList>("operations");
         QTest::addColumn<QStringList>("shown");
         QTest::addColumn<QStringList>("globalStack");
-        auto row = [](const char *tag, const QString &operations, const QString &shown,
-                      const QString &stack) {
-            QTest::addRow("%s", tag) << operations.split(QLatin1Char(' '), Qt::SkipEmptyParts)
-                                     << ids(shown.split(QLatin1Char(' '), Qt::SkipEmptyParts))
-                                     << ids(stack.split(QLatin1Char(' '), Qt::SkipEmptyParts));
+        auto row = [](const char *tag, const char *operations, const char *shown,
+                      const char *stack) {
+            QTest::addRow("%s", tag) << words(operations) << ids(words(shown)) << ids(words(stack));
         };
-        row("newest on top among equals", QStringLiteral("+A +B"), QStringLiteral("B"),
-            QStringLiteral("A B"));
-        row("higher priority stays above", QStringLiteral("+High +A"), QStringLiteral("High"),
-            QStringLiteral("A High"));
-        row("re-request moves up among equals", QStringLiteral("+A +B +A"), QStringLiteral("A"),
-            QStringLiteral("B A"));
-        row("dismissing the top reveals the next", QStringLiteral("+A +B -B"), QStringLiteral("A"),
-            QStringLiteral("A"));
-        row("dismissing below keeps the top", QStringLiteral("+A +B -A"), QStringLiteral("B"),
-            QStringLiteral("B"));
-        row("unknown identifier: recorded only", QStringLiteral("+Nowhere"), QString(), QString());
-        row("layer inactive: not shown", QStringLiteral("+Layer go:Menu"), QString(), QString());
-        row("layer active: shown beside the global one", QStringLiteral("go:Menu +Layer +A"),
-            QStringLiteral("A Layer"), QStringLiteral("A"));
-        row("leaving the layer closes its popups", QStringLiteral("go:Menu +Layer go:Home go:Menu"),
-            QString(), QString());
+        // clang-format off
+        row("newest on top among equals", "+A +B", "B", "A B");
+        row("higher priority stays above", "+High +A", "High", "A High");
+        row("re-request moves up among equals", "+A +B +A", "A", "B A");
+        row("dismissing the top reveals the next", "+A +B -B", "A", "A");
+        row("dismissing below keeps the top", "+A +B -A", "B", "B");
+        row("unknown identifier: recorded only", "+Nowhere", "", "");
+        row("layer inactive: not shown", "+Layer go:Menu", "", "");
+        row("layer active: shown beside the global one", "go:Menu +Layer +A", "A Layer", "A");
+        row("leaving the layer closes its popups", "go:Menu +Layer go:Home go:Menu", "", "");
+        // clang-format on
     }
     void popupStacking()
     {
@@ -321,33 +319,23 @@ private slots:
         QTest::addColumn<int>("steps");
         QTest::addColumn<QString>("landsOn");
         QTest::addColumn<QStringList>("backStack");
-        auto row = [](const char *tag, const QString &path, bool inCall, int steps,
-                      const QString &landsOn, const QString &stack) {
-            QTest::addRow("%s", tag) << path.split(QLatin1Char(' ')) << inCall << steps << landsOn
-                                     << stack.split(QLatin1Char(' '), Qt::SkipEmptyParts);
+        auto row = [](const char *tag, const char *path, bool inCall, int steps,
+                      const char *landsOn, const char *stack) {
+            QTest::addRow("%s", tag) << words(path) << inCall << steps
+                                     << QString::fromLatin1(landsOn) << words(stack);
         };
-        row("keypad back to the menu", QStringLiteral("Menu Keypad"), false, 1,
-            QStringLiteral("Menu"), QStringLiteral("Home Menu"));
-        row("menu back to home", QStringLiteral("Menu"), false, 1, QStringLiteral("Home"),
-            QStringLiteral("Home"));
-        row("two steps", QStringLiteral("Menu Keypad"), false, 2, QStringLiteral("Home"),
-            QStringLiteral("Home"));
-        row("back to the menu lets the root choose again", QStringLiteral("Menu Keypad"), true, 1,
-            QStringLiteral("CallView"), QStringLiteral("Home CallView"));
-        row("in-call keypad back where the call view goes",
-            QStringLiteral("Menu CallView InCallKeypad"), false, 1, QStringLiteral("Menu"),
-            QStringLiteral("Home Menu"));
-        row("call view entry is unique", QStringLiteral("CallView Menu CallView"), false, 1,
-            QStringLiteral("Menu"), QStringLiteral("Home Menu"));
-        row("contacts list straight to the phone root", QStringLiteral("Menu BookSearch BookList"),
-            false, 1, QStringLiteral("Menu"), QStringLiteral("Home Menu BookSearch Menu"));
-        row("back to the contacts list re-enters its chooser",
-            QStringLiteral("BookList BookSearch"), false, 1, QStringLiteral("BookList"),
-            QStringLiteral("Home BookList"));
-        row("message list skips the reply view", QStringLiteral("SmsReply SmsList"), false, 1,
-            QStringLiteral("Home"), QStringLiteral("Home"));
-        row("nothing to go back to", QStringLiteral("Home"), false, 1, QStringLiteral("Home"),
-            QStringLiteral("Home"));
+        // clang-format off
+        row("keypad back to the menu", "Menu Keypad", false, 1, "Menu", "Home Menu");
+        row("menu back to home", "Menu", false, 1, "Home", "Home");
+        row("two steps", "Menu Keypad", false, 2, "Home", "Home");
+        row("back to the menu lets the root choose again", "Menu Keypad", true, 1, "CallView", "Home CallView");
+        row("in-call keypad back where the call view goes", "Menu CallView InCallKeypad", false, 1, "Menu", "Home Menu");
+        row("call view entry is unique", "CallView Menu CallView", false, 1, "Menu", "Home Menu");
+        row("contacts list straight to the phone root", "Menu BookSearch BookList", false, 1, "Menu", "Home Menu BookSearch Menu");
+        row("back to the contacts list re-enters its chooser", "BookList BookSearch", false, 1, "BookList", "Home BookList");
+        row("message list skips the reply view", "SmsReply SmsList", false, 1, "Home", "Home");
+        row("nothing to go back to", "Home", false, 1, "Home", "Home");
+        // clang-format on
     }
     void back()
     {
