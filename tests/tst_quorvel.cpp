@@ -18,6 +18,8 @@
 
 #include <QTest>
 
+#include <functional>
+
 using namespace Quorvel;
 using TestSupport::processUntilIdle;
 
@@ -111,7 +113,11 @@ bool active(const QString &name)
     return state && state->isActive();
 }
 
+using Make = std::function<HmiAbstractTransition *(Source *, QState *)>;
+
 } // namespace
+
+Q_DECLARE_METATYPE(Make)
 
 class TestQuorvel : public QObject
 {
@@ -253,79 +259,65 @@ private slots:
     // The trigger of each kind, the guard's default and the transition data.
     void transitionKinds_data()
     {
-        QTest::addColumn<QString>("kind");
+        QTest::addColumn<Make>("make");
+        QTest::addColumn<QString>("drive"); // the steps are: "event" names, "key"s, "status"es,
+                                            // "value"s, "late" values (the source entered after
+                                            // the first)
         QTest::addColumn<QVariantList>("steps");
         QTest::addColumn<int>("fires");
         QTest::addColumn<QVariant>("data");
-        const QVariant none;
-        QTest::addRow("event: exact name, value as data")
-                << "event"
-                << QVariantList{QStringLiteral("Go"), QStringLiteral("go"), QStringLiteral("GO")}
-                << 1 << QVariant(QStringLiteral("Go"));
-        QTest::addRow("int signal: equal value only")
-                << "int 3" << QVariantList{1, 3, 4, 3} << 2 << QVariant(3);
-        QTest::addRow("key: key and kind both equal")
-                << "key 12 2"
-                << QVariantList{QVariantList{12, 2}, QVariantList{12, 3}, QVariantList{77, 2}} << 1
-                << QVariant(QVariantList{12, 2});
-        QTest::addRow("change: any to 3, only real changes")
-                << "change [] 3" << QVariantList{3, 3, 4, 3} << 2 << QVariant(3);
-        QTest::addRow("change: 3 to 7 only")
-                << "change [3] 7" << QVariantList{4, 7, 3, 7} << 1 << QVariant(7);
-        QTest::addRow("change: 12 to any other")
-                << "change [12] null" << QVariantList{12, 5, 12, 12, 0} << 2 << QVariant(0);
-        QTest::addRow("change: false to true")
-                << "change [false] true" << QVariantList{false, true, true, false, true} << 2
-                << QVariant(true);
-        QTest::addRow("change: remembered while source inactive")
-                << "change inactive [3] 7" << QVariantList{3, 7} << 1 << QVariant(7);
-        QTest::addRow("guard: default refuses") << "guarded" << QVariantList{1} << 0 << none;
-        QTest::addRow("guard: default allows when set")
-                << "guarded default" << QVariantList{1} << 1 << QVariant(1);
-        QTest::addRow("property: every notification")
-                << "property" << QVariantList{1, 1} << 2 << QVariant(1);
+        auto change = [](const QVariantList &from, const QVariant &to) {
+            return Make([=](Source *source, QState *state) -> HmiAbstractTransition * {
+                return new GuardedPropertyChangeTransition(source, "value", from, to, state);
+            });
+        };
+        auto guarded = [](bool allow) {
+            return Make([=](Source *source, QState *state) -> HmiAbstractTransition * {
+                auto *t = new GuardedSignalTransition(source, "statusChanged(int)", state);
+                t->setAllowTransitionDefault(allow);
+                QObject::connect(t, &HmiAbstractTransition::transitionTest, [] {});
+                return t;
+            });
+        };
+        const Make event = [](Source *, QState *state) {
+            return new HmiTransition(QStringLiteral("Go"), state);
+        };
+        const Make intSignal = [](Source *source, QState *state) {
+            return new IntSignalTransition(source, SIGNAL(statusChanged(int)), 3, state);
+        };
+        const Make key = [](Source *source, QState *state) {
+            return new KeySignalTransition(source, "2keyEvent(int, int)", 12, 2, state);
+        };
+        const Make property = [](Source *source, QState *state) {
+            return new GuardedPropertyTransition(source, "value", state);
+        };
+        const QString go = QStringLiteral("Go");
+        // clang-format off
+        QTest::addRow("event: exact name, value as data") << event << "event" << QVariantList{go, QStringLiteral("go"), QStringLiteral("GO")} << 1 << QVariant(go);
+        QTest::addRow("int signal: equal value only") << intSignal << "status" << QVariantList{1, 3, 4, 3} << 2 << QVariant(3);
+        QTest::addRow("key: key and kind both equal") << key << "key" << QVariantList{QVariantList{12, 2}, QVariantList{12, 3}, QVariantList{77, 2}} << 1 << QVariant(QVariantList{12, 2});
+        QTest::addRow("change: any to 3, only real changes") << change({}, 3) << "value" << QVariantList{3, 3, 4, 3} << 2 << QVariant(3);
+        QTest::addRow("change: 3 to 7 only") << change({3}, 7) << "value" << QVariantList{4, 7, 3, 7} << 1 << QVariant(7);
+        QTest::addRow("change: 12 to any other") << change({12}, QVariant()) << "value" << QVariantList{12, 5, 12, 12, 0} << 2 << QVariant(0);
+        QTest::addRow("change: false to true") << change({false}, true) << "value" << QVariantList{false, true, true, false, true} << 2 << QVariant(true);
+        QTest::addRow("change: remembered while source inactive") << change({3}, 7) << "late" << QVariantList{3, 7} << 1 << QVariant(7);
+        QTest::addRow("guard: default refuses") << guarded(false) << "status" << QVariantList{1} << 0 << QVariant();
+        QTest::addRow("guard: default allows when set") << guarded(true) << "status" << QVariantList{1} << 1 << QVariant(1);
+        QTest::addRow("property: every notification") << property << "value" << QVariantList{1, 1} << 2 << QVariant(1);
+        // clang-format on
     }
     void transitionKinds()
     {
-        QFETCH(QString, kind);
+        QFETCH(Make, make);
+        QFETCH(QString, drive);
         QFETCH(QVariantList, steps);
         QFETCH(int, fires);
         QFETCH(QVariant, data);
         Tree tree;
         Source source;
         source.setValue(0);
-        const QStringList words = kind.split(QLatin1Char(' '));
-        auto toValue = [](const QString &word) -> QVariant {
-            if (word == QLatin1String("null"))
-                return QVariant();
-            if (word == QLatin1String("true") || word == QLatin1String("false"))
-                return word == QLatin1String("true");
-            return word.toInt();
-        };
-        HmiAbstractTransition *t = nullptr;
-        QState *sourceState = kind.contains(QLatin1String("inactive")) ? tree.contacts : tree.menu;
-        if (words[0] == QLatin1String("event")) {
-            t = new HmiTransition(QStringLiteral("Go"), sourceState);
-        } else if (words[0] == QLatin1String("int")) {
-            t = new IntSignalTransition(&source, SIGNAL(statusChanged(int)), words[1].toInt(),
-                                        sourceState);
-        } else if (words[0] == QLatin1String("key")) {
-            t = new KeySignalTransition(&source, "2keyEvent(int, int)", words[1].toInt(),
-                                        words[2].toInt(), sourceState);
-        } else if (words[0] == QLatin1String("change")) {
-            const QString fromWord = words[words.size() - 2];
-            QVariantList from;
-            if (fromWord != QLatin1String("[]"))
-                from << toValue(fromWord.mid(1, fromWord.size() - 2));
-            t = new GuardedPropertyChangeTransition(&source, "value", from, toValue(words.last()),
-                                                    sourceState);
-        } else if (words[0] == QLatin1String("guarded")) {
-            t = new GuardedSignalTransition(&source, "statusChanged(int)", sourceState);
-            t->setAllowTransitionDefault(words.size() > 1);
-            QObject::connect(t, &HmiAbstractTransition::transitionTest, [] {});
-        } else {
-            t = new GuardedPropertyTransition(&source, "value", sourceState);
-        }
+        const bool late = drive == QLatin1String("late");
+        HmiAbstractTransition *t = make(&source, late ? tree.contacts : tree.menu);
         QVariant lastData;
         int count = 0;
         QObject::connect(t, &QAbstractTransition::triggered, [&] {
@@ -335,21 +327,17 @@ private slots:
         tree.start();
         tree.goTo(tree.menu);
 
-        for (int i = 0; i < steps.size(); ++i) {
-            const QVariant &step = steps.at(i);
-            if (words[0] == QLatin1String("event")) {
+        for (const QVariant &step : qAsConst(steps)) {
+            if (drive == QLatin1String("event"))
                 tree.machine->postEvent(new HmiEvent(step.toString(), step));
-            } else if (words[0] == QLatin1String("key")) {
-                const QVariantList key = step.toList();
-                emit source.keyEvent(key[0].toInt(), key[1].toInt());
-            } else if (words[0] == QLatin1String("change")
-                       || words[0] == QLatin1String("property")) {
-                source.setValue(step);
-            } else {
+            else if (drive == QLatin1String("key"))
+                emit source.keyEvent(step.toList().at(0).toInt(), step.toList().at(1).toInt());
+            else if (drive == QLatin1String("status"))
                 source.setStatus(step.toInt());
-            }
+            else
+                source.setValue(step);
             processUntilIdle();
-            if (kind.contains(QLatin1String("inactive")) && i == 0)
+            if (late && &step == &steps.constFirst())
                 tree.goTo(tree.contacts); // the first change happened while the source was inactive
         }
         QCOMPARE(count, fires);
