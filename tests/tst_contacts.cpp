@@ -174,21 +174,14 @@ private slots:
         QTest::addColumn<QString>("event");
         QTest::addColumn<QString>("outputs");
 
-        QTest::addRow("status check, empty")
-                << false << 3 << Events::HmiPhone_PhoneBookStatusCheck << DismissStatusPopups;
-        QTest::addRow("status check, other letter case")
-                << false << 3 << "HmiPhone_PhonebookStatusCheck"
-                << "";
-        QTest::addRow("cancelled, contacts shown")
-                << true << 2 << Events::HmiPhone_PhoneBookDownloadCanceled
-                << "back exitingPhoneBook";
-        QTest::addRow("cancelled elsewhere")
-                << false << 2 << Events::HmiPhone_PhoneBookDownloadCanceled << "exitingPhoneBook";
-        QTest::addRow("waiting, contacts shown")
-                << true << 1 << Events::HmiPhone_ShowPhoneBookWaitingForResponseRequest
-                << "+WaitingForResponseFromPhone";
-        QTest::addRow("waiting elsewhere")
-                << false << 1 << Events::HmiPhone_ShowPhoneBookWaitingForResponseRequest << "";
+        // clang-format off
+        QTest::addRow("status check, empty") << false << 3 << Events::HmiPhone_PhoneBookStatusCheck << DismissStatusPopups;
+        QTest::addRow("status check, other letter case") << false << 3 << "HmiPhone_PhonebookStatusCheck" << "";
+        QTest::addRow("cancelled, contacts shown") << true << 2 << Events::HmiPhone_PhoneBookDownloadCanceled << "back exitingPhoneBook";
+        QTest::addRow("cancelled elsewhere") << false << 2 << Events::HmiPhone_PhoneBookDownloadCanceled << "exitingPhoneBook";
+        QTest::addRow("waiting, contacts shown") << true << 1 << Events::HmiPhone_ShowPhoneBookWaitingForResponseRequest << "+WaitingForResponseFromPhone";
+        QTest::addRow("waiting elsewhere") << false << 1 << Events::HmiPhone_ShowPhoneBookWaitingForResponseRequest << "";
+        // clang-format on
     }
 
     void globalTransitions()

@@ -368,14 +368,12 @@ private slots:
         QTest::addColumn<QList<int>>("levels"); // -100 stands for "the phone device changed"
         QTest::addColumn<QList<bool>>("answers");
 
-        QTest::newRow("enter, stay, leave, re-enter")
-                << QList<int>{3, 1, 1, 0, 2, 1}
-                << QList<bool>{false, true, false, false, false, true};
+        // clang-format off
+        QTest::newRow("enter, stay, leave, re-enter") << QList<int>{3, 1, 1, 0, 2, 1} << QList<bool>{false, true, false, false, false, true};
         QTest::newRow("first reading already low") << QList<int>{1} << QList<bool>{true};
-        QTest::newRow("unknown level re-arms")
-                << QList<int>{1, -1, 0} << QList<bool>{true, false, true};
-        QTest::newRow("new phone warns again")
-                << QList<int>{0, -100, 0} << QList<bool>{true, false, true};
+        QTest::newRow("unknown level re-arms") << QList<int>{1, -1, 0} << QList<bool>{true, false, true};
+        QTest::newRow("new phone warns again") << QList<int>{0, -100, 0} << QList<bool>{true, false, true};
+        // clang-format on
     }
 
     void batteryWarning()
@@ -469,24 +467,18 @@ private slots:
         QTest::addColumn<QList<int>>("rows"); // min, max; empty when nothing is set
 
         const QVariantList ae;
+        // clang-format off
         QTest::newRow("c") << ae << QStringLiteral("c") << QList<int>{10, 24};
         QTest::newRow("E runs to the end") << ae << QStringLiteral("E") << QList<int>{40, 59};
         QTest::newRow("A section of 10 rows") << ae << QStringLiteral("a") << QList<int>{0, 9};
         QTest::newRow("B has no contacts") << ae << QStringLiteral("B") << QList<int>{-1, -1};
         QTest::newRow("Z not in the bar") << ae << QStringLiteral("Z") << QList<int>{-1, -1};
         QTest::newRow("empty letter") << ae << QString() << QList<int>();
-        QTest::newRow("long section gives 20 rows")
-                << QVariantList{QStringLiteral("A"), 0, QStringLiteral("B"), 45}
-                << QStringLiteral("A") << QList<int>{0, 19};
-        QTest::newRow("Greek letters stay apart")
-                << QVariantList{QString(QChar(0x391)), 0, QString(QChar(0x392)), 5}
-                << QString(QChar(0x3B1)) << QList<int>{0, 4};
-        QTest::newRow("Cyrillic does not match an empty entry")
-                << QVariantList{QString(), 0, QStringLiteral("A"), 5} << QString(QChar(0x416))
-                << QList<int>{-1, -1};
-        QTest::newRow("CJK letter")
-                << QVariantList{QString(QChar(0x4E00)), 0, QString(QChar(0x4E8C)), 8}
-                << QString(QChar(0x4E00)) << QList<int>{0, 7};
+        QTest::newRow("long section gives 20 rows") << QVariantList{QStringLiteral("A"), 0, QStringLiteral("B"), 45} << QStringLiteral("A") << QList<int>{0, 19};
+        QTest::newRow("Greek letters stay apart") << QVariantList{QString(QChar(0x391)), 0, QString(QChar(0x392)), 5} << QString(QChar(0x3B1)) << QList<int>{0, 4};
+        QTest::newRow("Cyrillic does not match an empty entry") << QVariantList{QString(), 0, QStringLiteral("A"), 5} << QString(QChar(0x416)) << QList<int>{-1, -1};
+        QTest::newRow("CJK letter") << QVariantList{QString(QChar(0x4E00)), 0, QString(QChar(0x4E8C)), 8} << QString(QChar(0x4E00)) << QList<int>{0, 7};
+        // clang-format on
     }
 
     void windowForLetter()

@@ -82,34 +82,17 @@ private slots:
         const QString recent = Events::HmiPhone_ShowRecentCallsRequest;
         const QString notification = QStringLiteral("notification on");
         const QString inCall = Connected + "phone.status=4"_q;
-        QTest::addRow("keypad from the menu")
-                << Connected << QStringList{keypad} << "DialKeypadViewState"_q
-                << ""_q;
-        QTest::addRow("no keypad from the call")
-                << inCall << QStringList{keypad} << "CallInProgressViewState"_q
-                << ""_q;
-        QTest::addRow("recent calls from the call")
-                << inCall << QStringList{recent} << "RecentCallsListViewState"_q
-                << ""_q;
-        QTest::addRow("recent calls from the keypad")
-                << Connected << QStringList{keypad, recent} << "RecentCallsListViewState"_q
-                << ""_q;
-        QTest::addRow("reconnection failed during a call")
-                << inCall << QStringList{"reconnect failed"_q} << "HmiPhone_Limbo"_q
-                << "intent 70()"_q;
-        QTest::addRow("notification on in the menu")
-                << Connected << QStringList{notification} << "PhoneMenuViewState"_q
-                << "event HmiPhone_ShowSmsRequest"_q;
-        QTest::addRow("notification on in the keypad")
-                << Connected << QStringList{keypad, notification} << "DialKeypadViewState"_q
-                << ""_q;
-        QTest::addRow("status 5 to 3: the call goes on")
-                << Connected + "phone.status=5"_q << QStringList{"status=3"_q}
-                << "CallInProgressViewState"_q
-                << ""_q;
-        QTest::addRow("status 3 to 2: the call ended")
-                << Connected + "phone.status=3"_q << QStringList{"status=2"_q} << "HostHome"_q
-                << "back 1"_q;
+        // clang-format off
+        QTest::addRow("keypad from the menu") << Connected << QStringList{keypad} << "DialKeypadViewState"_q << ""_q;
+        QTest::addRow("no keypad from the call") << inCall << QStringList{keypad} << "CallInProgressViewState"_q << ""_q;
+        QTest::addRow("recent calls from the call") << inCall << QStringList{recent} << "RecentCallsListViewState"_q << ""_q;
+        QTest::addRow("recent calls from the keypad") << Connected << QStringList{keypad, recent} << "RecentCallsListViewState"_q << ""_q;
+        QTest::addRow("reconnection failed during a call") << inCall << QStringList{"reconnect failed"_q} << "HmiPhone_Limbo"_q << "intent 70()"_q;
+        QTest::addRow("notification on in the menu") << Connected << QStringList{notification} << "PhoneMenuViewState"_q << "event HmiPhone_ShowSmsRequest"_q;
+        QTest::addRow("notification on in the keypad") << Connected << QStringList{keypad, notification} << "DialKeypadViewState"_q << ""_q;
+        QTest::addRow("status 5 to 3: the call goes on") << Connected + "phone.status=5"_q << QStringList{"status=3"_q} << "CallInProgressViewState"_q << ""_q;
+        QTest::addRow("status 3 to 2: the call ended") << Connected + "phone.status=3"_q << QStringList{"status=2"_q} << "HostHome"_q << "back 1"_q;
+        // clang-format on
     }
 
     void navigation()
@@ -158,32 +141,21 @@ private slots:
         const QString number = Connected + "phone.callNumberEntered=0123"_q;
         const QString dial = QStringLiteral("phone.dialNumber(0123)");
 
+        const QString popup = QStringLiteral("popup-request ");
+        // clang-format off
         QTest::addRow("Siri activated") << siriOk << siri << "phone.toggleSiriActivation(true)"_q;
-        QTest::addRow("Siri deactivated, voice session cancelled")
-                << siriOk + " phone.siriActive=true speech.sessionState=3"_q << siri
-                << "speech.cancelVRSession(); phone.toggleSiriActivation(false)"_q;
-        QTest::addRow("Siri unsupported")
-                << Connected + "phone.siriEnabled=true"_q << siri << refused;
-        QTest::addRow("Siri disabled")
-                << Connected + "phone.siriSupported=true"_q << siri << refused;
+        QTest::addRow("Siri deactivated, voice session cancelled") << siriOk + " phone.siriActive=true speech.sessionState=3"_q << siri << "speech.cancelVRSession(); phone.toggleSiriActivation(false)"_q;
+        QTest::addRow("Siri unsupported") << Connected + "phone.siriEnabled=true"_q << siri << refused;
+        QTest::addRow("Siri disabled") << Connected + "phone.siriSupported=true"_q << siri << refused;
         QTest::addRow("Siri without a device") << siriOk.mid(Connected.size()) << siri << refused;
-        QTest::addRow("DND on, whatever the key")
-                << Connected + "ardel.ignitionKeyType=2"_q << dnd << "phone.enableDoNotDisturb()"_q;
-        QTest::addRow("DND off") << Connected + "phone.doNotDisturb=true"_q << dnd
-                                 << "phone.disableDoNotDisturb()"_q;
-        QTest::addRow("DND off, allowed by the restricted key")
-                << Connected
-                        + "phone.doNotDisturb=true ardel.ignitionKeyType=2 ardel.doNotDisturbOption=true"_q
-                << dnd << "phone.disableDoNotDisturb()"_q;
-        QTest::addRow("DND off, forbidden by the restricted key")
-                << Connected + "phone.doNotDisturb=true ardel.ignitionKeyType=2"_q << dnd
-                << QStringLiteral("popup-request ") + Views::PhoneDndActiveArdel;
+        QTest::addRow("DND on, whatever the key") << Connected + "ardel.ignitionKeyType=2"_q << dnd << "phone.enableDoNotDisturb()"_q;
+        QTest::addRow("DND off") << Connected + "phone.doNotDisturb=true"_q << dnd << "phone.disableDoNotDisturb()"_q;
+        QTest::addRow("DND off, allowed by the restricted key") << Connected + "phone.doNotDisturb=true ardel.ignitionKeyType=2 ardel.doNotDisturbOption=true"_q << dnd << "phone.disableDoNotDisturb()"_q;
+        QTest::addRow("DND off, forbidden by the restricted key") << Connected + "phone.doNotDisturb=true ardel.ignitionKeyType=2"_q << dnd << popup + Views::PhoneDndActiveArdel;
         QTest::addRow("dial") << number << call << dial;
-        QTest::addRow("dial roaming, warning off")
-                << number + " phone.roaming=true"_q << call << dial;
-        QTest::addRow("dial roaming, warning on")
-                << number + " phone.roaming=true phone.roamingWarning=true"_q << call
-                << QStringLiteral("popup-request ") + Views::RoamingWarning;
+        QTest::addRow("dial roaming, warning off") << number + " phone.roaming=true"_q << call << dial;
+        QTest::addRow("dial roaming, warning on") << number + " phone.roaming=true phone.roamingWarning=true"_q << call << popup + Views::RoamingWarning;
+        // clang-format on
     }
 
     void actions()

@@ -78,31 +78,21 @@ private slots:
                             {QStringLiteral("supportPhoneNumber"), number}};
             return QVariant(map);
         };
-        QTest::addRow("clear 1001")
-                << clear << QVariant(1001) << Views::PhoneStatusAlertPopup50 << QString();
-        QTest::addRow("clear 1004 at once") << clear << QVariant(1004) << QString()
-                                            << QStringLiteral("phone.clearAlertForThisCycle(1004)");
-        QTest::addRow("clear 1005")
-                << clear << QVariant(1005) << Views::PhoneStatusAlertPopup54 << QString();
+        // clang-format off
+        QTest::addRow("clear 1001") << clear << QVariant(1001) << Views::PhoneStatusAlertPopup50 << QString();
+        QTest::addRow("clear 1004 at once") << clear << QVariant(1004) << QString() << QStringLiteral("phone.clearAlertForThisCycle(1004)");
+        QTest::addRow("clear 1005") << clear << QVariant(1005) << Views::PhoneStatusAlertPopup54 << QString();
         QTest::addRow("clear 1011") << clear << QVariant(1011) << QString() << QString();
-        QTest::addRow("fix 1004") << fix << QVariant(1004) << Views::PhoneStatusAlertPopup63
-                                  << QString();
-        QTest::addRow("fix 1010") << fix << QVariant(1010) << Views::PhoneStatusAlertPopup69
-                                  << QString();
+        QTest::addRow("fix 1004") << fix << QVariant(1004) << Views::PhoneStatusAlertPopup63 << QString();
+        QTest::addRow("fix 1010") << fix << QVariant(1010) << Views::PhoneStatusAlertPopup69 << QString();
         QTest::addRow("fix 1011") << fix << QVariant(1011) << QString() << QString();
-        QTest::addRow("clear permanently") << permanently << QVariant(1003) << QString()
-                                           << QStringLiteral("phone.clearAlertPermanently(1003)");
-        QTest::addRow("clear permanently, negative id")
-                << permanently << QVariant(-1) << QString() << QString();
-        QTest::addRow("clear for this cycle, not a number")
-                << cycle << QVariant(QStringLiteral("alert")) << QString() << QString();
-        QTest::addRow("call for fix")
-                << call << fixData(1005, QStringLiteral("0800123")) << QString()
-                << QStringLiteral("phone.callForFixAlert(1005,0800123)");
-        QTest::addRow("call for fix without a number")
-                << call << fixData(1005, QVariant()) << QString() << QString();
-        QTest::addRow("call for fix without an id")
-                << call << fixData(QVariant(), QStringLiteral("0800123")) << QString() << QString();
+        QTest::addRow("clear permanently") << permanently << QVariant(1003) << QString() << QStringLiteral("phone.clearAlertPermanently(1003)");
+        QTest::addRow("clear permanently, negative id") << permanently << QVariant(-1) << QString() << QString();
+        QTest::addRow("clear for this cycle, not a number") << cycle << QVariant(QStringLiteral("alert")) << QString() << QString();
+        QTest::addRow("call for fix") << call << fixData(1005, QStringLiteral("0800123")) << QString() << QStringLiteral("phone.callForFixAlert(1005,0800123)");
+        QTest::addRow("call for fix without a number") << call << fixData(1005, QVariant()) << QString() << QString();
+        QTest::addRow("call for fix without an id") << call << fixData(QVariant(), QStringLiteral("0800123")) << QString() << QString();
+        // clang-format on
     }
 
     void requests()

@@ -146,18 +146,16 @@ private slots:
         QTest::addColumn<QString>("steps");
         QTest::addColumn<int>("requests");
 
+        // clang-format off
         QTest::addRow("two entries, no change") << false << QStringLiteral("enter") << 1;
-        QTest::addRow("count changed between entries")
-                << false << QStringLiteral("count enter") << 2;
-        QTest::addRow("device changed between entries")
-                << false << QStringLiteral("device enter") << 2;
-        QTest::addRow("a change during a download counts as handled")
-                << false << QStringLiteral("running count enter finished enter count enter") << 2;
+        QTest::addRow("count changed between entries") << false << QStringLiteral("count enter") << 2;
+        QTest::addRow("device changed between entries") << false << QStringLiteral("device enter") << 2;
+        QTest::addRow("a change during a download counts as handled") << false << QStringLiteral("running count enter finished enter count enter") << 2;
         QTest::addRow("a new message forces a request") << false << QStringLiteral("new") << 2;
-        QTest::addRow("no forced request during a download")
-                << false << QStringLiteral("running new") << 1;
+        QTest::addRow("no forced request during a download") << false << QStringLiteral("running new") << 1;
         QTest::addRow("an empty inbox asks nothing") << true << QStringLiteral("enter") << 0;
         QTest::addRow("the inbox fills while shown") << true << QStringLiteral("filled") << 1;
+        // clang-format on
     }
 
     void inboxRequests()
