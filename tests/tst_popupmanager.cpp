@@ -5,7 +5,6 @@
 #include "testsupport.h"
 
 #include <brisken/viewmanager.h>
-#include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 
 #include <QMetaMethod>
@@ -173,28 +172,6 @@ private slots:
         QCOMPARE(entries.size(), 1);
         QCOMPARE(entries.first().kind, kind);
         QCOMPARE(entries.first().fields.value(QStringLiteral("id")).toString(), viewId);
-    }
-
-    // Two pairs of slots share one view: the one shown through either pair closes through the
-    // other. The request carries no data.
-    void sharedStandByPopup()
-    {
-        Quorvel::StateMachine *machine = Quorvel::StateMachine::instance();
-        const QString viewId = phoneView("PhoneCallStandByModePopup");
-        machine->installRootHierarchy({},
-                                      {{Quorvel::StateLevel3, new Quorvel::PopupState(viewId, 1)}});
-        machine->start();
-        TestSupport::processUntilIdle();
-
-        HmiPhonePopupManager::instance()->showTransferToPhone();
-        TestSupport::processUntilIdle();
-        QCOMPARE(machine->shownPopups(), QStringList{viewId});
-        QVERIFY(!machine->popupState(viewId)->popupData().isValid());
-
-        HmiPhonePopupManager::instance()->hidePhoneCallStandByModePopup();
-        TestSupport::processUntilIdle();
-        QCOMPARE(machine->shownPopups(), QStringList());
-        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-hidden")), QStringList{viewId});
     }
 
 private:
