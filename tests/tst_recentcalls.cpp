@@ -85,7 +85,6 @@ private slots:
         QFETCH(bool, keepType);
         QFETCH(QString, screen);
 
-        auto *phone = Mavrosk::PhoneSource::instance();
         start(QStringLiteral("currentRecentCallListType=2 recentCallListStatus=%1").arg(status));
         const qint64 since = mark();
         if (keepType)
