@@ -11,6 +11,7 @@
 #include <QCoreApplication>
 #include <QStringList>
 #include <QTest>
+#include <QTimer>
 
 namespace TestSupport {
 
@@ -88,13 +89,19 @@ inline QStringList bridgeCommandsSince(qint64 since)
     return journalLines(since, {QStringLiteral("bridge")});
 }
 
-// Records the warnings of Qt's state machine and fails the running test in cleanup() unless the
-// test declared them with QTest::ignoreMessage.
+// Records the warnings of Qt's state machine and fails the running test in cleanup(); a test that
+// expects one takes it with take() itself.
 class FrameworkWarningGuard
 {
 public:
-    FrameworkWarningGuard() { s_previous = qInstallMessageHandler(&FrameworkWarningGuard::handle); }
-    ~FrameworkWarningGuard() { qInstallMessageHandler(s_previous); }
+    FrameworkWarningGuard()
+    {
+        s_original = s_previous = qInstallMessageHandler(&FrameworkWarningGuard::handle);
+        // QtTest puts its own handler in front when the run starts and passes nothing on: take
+        // the front place again once the run has begun (before any posted event is handled).
+        QTimer::singleShot(0, [] { s_previous = qInstallMessageHandler(&handle); });
+    }
+    ~FrameworkWarningGuard() { qInstallMessageHandler(s_original); }
 
     // Returns the recorded warnings and forgets them.
     static QStringList take()
@@ -112,6 +119,13 @@ private:
     }
     static void handle(QtMsgType type, const QMessageLogContext &context, const QString &message)
     {
+        static bool forwarding = false;
+        if (forwarding) { // QtTest, after its run, hands the message back to the handler it
+                          // replaced
+            if (s_original)
+                s_original(type, context, message);
+            return;
+        }
         static const char *const watched[] = {"QStateMachine", "QState::", "QSignalTransition",
                                               "No such signal", "Missing initial state"};
         if (type == QtWarningMsg)
@@ -120,10 +134,12 @@ private:
                     warnings().append(message);
                     break;
                 }
+        forwarding = true;
         if (s_previous)
             s_previous(type, context, message);
+        forwarding = false;
     }
     static inline QtMessageHandler s_previous = nullptr;
+    static inline QtMessageHandler s_original = nullptr;
 };
-
 } // namespace TestSupport
