@@ -65,29 +65,16 @@ private slots:
         const QString key = Events::HmiPhone_DialPadKeyPressed;
         const QString backspace = Events::HmiPhone_DialPadBackSpace;
         const QString longPress = Events::HmiPhone_DialPadBackSpaceLongPress;
-        QTest::addRow("entry clears a number left from before")
-                << QStringLiteral("0789") << QVariantList() << QString() << 0;
-        QTest::addRow("0, * and # in turn")
-                << QString()
-                << QVariantList{step(key, QStringLiteral("0")), step(key, QStringLiteral("*")),
-                                step(key, QStringLiteral("#"))}
-                << QStringLiteral("0*#") << 3;
-        QTest::addRow("key without a value or not a string")
-                << QString()
-                << QVariantList{step(key, QStringLiteral("4")), step(key),
-                                step(key, QVariantList{1, 2}),
-                                step(key, QVariantMap{{QStringLiteral("key"), 5}})}
-                << QStringLiteral("4") << 1;
-        QTest::addRow("backspace on 12")
-                << QString() << QVariantList{step(key, QStringLiteral("12")), step(backspace)}
-                << QStringLiteral("1") << 2;
-        QTest::addRow("backspace on the empty number")
-                << QString() << QVariantList{step(backspace)} << QString() << 0;
-        QTest::addRow("long press on 0123")
-                << QString() << QVariantList{step(key, QStringLiteral("0123")), step(longPress)}
-                << QString() << 2;
-        QTest::addRow("long press on the empty number")
-                << QString() << QVariantList{step(longPress)} << QString() << 0;
+        const QString none, one = QStringLiteral("1"), four = QStringLiteral("4");
+        // clang-format off
+        QTest::addRow("entry clears a number left from before") << QStringLiteral("0789") << QVariantList() << none << 0;
+        QTest::addRow("0, * and # in turn") << none << QVariantList{step(key, QStringLiteral("0")), step(key, QStringLiteral("*")), step(key, QStringLiteral("#"))} << QStringLiteral("0*#") << 3;
+        QTest::addRow("key without a value or not a string") << none << QVariantList{step(key, four), step(key), step(key, QVariantList{1, 2}), step(key, QVariantMap{{four, 5}})} << four << 1;
+        QTest::addRow("backspace on 12") << none << QVariantList{step(key, QStringLiteral("12")), step(backspace)} << one << 2;
+        QTest::addRow("backspace on the empty number") << none << QVariantList{step(backspace)} << none << 0;
+        QTest::addRow("long press on 0123") << none << QVariantList{step(key, QStringLiteral("0123")), step(longPress)} << none << 2;
+        QTest::addRow("long press on the empty number") << none << QVariantList{step(longPress)} << none << 0;
+        // clang-format on
     }
 
     void keypadEditsNumber()

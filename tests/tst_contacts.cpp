@@ -71,26 +71,16 @@ private slots:
         QTest::addColumn<bool>("list");
         QTest::addColumn<QString>("outputs");
 
-        QTest::addRow("downloading") << 2 << true << true << false
-                                     << "-DownloadFailed -DownloadFailedAgain -AccessNotGranted "
-                                        "-AutoDownload -WaitingForResponseFromPhone +Downloading";
-        QTest::addRow("downloaded") << 1 << false << true << true
-                                    << "resetPhoneBook -DownloadFailed -DownloadFailedAgain "
-                                       "-AutoDownload -Downloading -AccessNotGranted "
-                                       "-WaitingForResponseFromPhone";
-        QTest::addRow("status 7, auto download off")
-                << 7 << false << true << true << "resetPhoneBook +AutoDownload";
-        QTest::addRow("no list, auto download off")
-                << 0 << false << true << false << "+AutoDownload";
-        QTest::addRow("access refused") << 4 << true << true << false
-                                        << Waiting + QLatin1Char(' ') + DismissStatusPopups
-                        + QStringLiteral(" +AccessNotGranted");
-        QTest::addRow("download failed")
-                << 5 << true << true << false
-                << Waiting
-                        + QStringLiteral(
-                                " -Downloading -WaitingForResponseFromPhone +DownloadFailed");
+        const QString wait = Waiting + QLatin1Char(' ');
+        // clang-format off
+        QTest::addRow("downloading") << 2 << true << true << false << "-DownloadFailed -DownloadFailedAgain -AccessNotGranted -AutoDownload -WaitingForResponseFromPhone +Downloading";
+        QTest::addRow("downloaded") << 1 << false << true << true << "resetPhoneBook -DownloadFailed -DownloadFailedAgain -AutoDownload -Downloading -AccessNotGranted -WaitingForResponseFromPhone";
+        QTest::addRow("status 7, auto download off") << 7 << false << true << true << "resetPhoneBook +AutoDownload";
+        QTest::addRow("no list, auto download off") << 0 << false << true << false << "+AutoDownload";
+        QTest::addRow("access refused") << 4 << true << true << false << wait + DismissStatusPopups + QStringLiteral(" +AccessNotGranted");
+        QTest::addRow("download failed") << 5 << true << true << false << wait + QStringLiteral("-Downloading -WaitingForResponseFromPhone +DownloadFailed");
         QTest::addRow("no device") << 0 << false << false << false << "";
+        // clang-format on
     }
 
     void entry()
