@@ -2,7 +2,8 @@
 
 namespace Platform {
 
-Journal::Journal(QObject *parent) : QObject(parent)
+Journal::Journal(QObject *parent)
+    : QObject(parent)
 {
     qRegisterMetaType<Platform::JournalEntry>();
 }
