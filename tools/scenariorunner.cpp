@@ -344,13 +344,14 @@ void ScenarioRunner::apply(const ScenarioStep &step)
             break;
         }
         const QVariantList rows = o.value(QLatin1String("rows")).toArray().toVariantList();
-        if (auto *list = qobject_cast<Mavrosk::MultiDPListModel *>(model)) {
-            list->setRows(rows);
-        } else if (auto *infinite = qobject_cast<Mavrosk::InfiniteListModel *>(model)) {
+        // The contact list is a kind of row list that also has a length of its own.
+        if (auto *infinite = qobject_cast<Mavrosk::InfiniteListModel *>(model)) {
             if (o.contains(QLatin1String("rows")))
                 infinite->setRows(rows);
             if (o.contains(QLatin1String("length")))
                 infinite->setListLength(o.value(QLatin1String("length")).toInt());
+        } else if (auto *list = qobject_cast<Mavrosk::MultiDPListModel *>(model)) {
+            list->setRows(rows);
         }
         break;
     }
