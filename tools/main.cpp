@@ -201,7 +201,10 @@ int main(int argc, char *argv[])
                            .arg(failedLines.join(QStringLiteral(", "))));
         return ChecksFailed;
     }
-    output.note(
-            QStringLiteral("# %1: all %2 checks passed").arg(scenarioName).arg(runner.checks()));
+    output.note(QStringLiteral("# %1: %2 passed")
+                        .arg(scenarioName,
+                             runner.checks() == 1
+                                     ? QStringLiteral("the one check")
+                                     : QStringLiteral("all %1 checks").arg(runner.checks())));
     return Passed;
 }
