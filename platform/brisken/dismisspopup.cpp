@@ -2,26 +2,15 @@
 
 #include "viewcontroller.h"
 
-#include <QAbstractState>
-
 namespace Brisken {
 
 DismissPopup::DismissPopup(const QString &viewId)
-    : m_viewId(viewId)
-    , m_fromState(false)
+    : m_view(viewId)
 { }
 
 DismissPopup::DismissPopup(QAbstractState *popupState)
-    : m_fromState(true)
-    , m_popupState(popupState)
+    : m_view(popupState)
 { }
-
-QString DismissPopup::viewId() const
-{
-    if (!m_fromState)
-        return m_viewId;
-    return m_popupState ? m_popupState->objectName() : QString();
-}
 
 void DismissPopup::run() const
 {

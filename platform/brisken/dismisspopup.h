@@ -1,9 +1,8 @@
 #pragma once
 
-#include <QPointer>
-#include <QString>
+#include "viewname.h"
 
-class QAbstractState;
+#include <QString>
 
 namespace Brisken {
 
@@ -18,12 +17,10 @@ public:
     void run() const;
     void operator()() const { run(); }
 
-    QString viewId() const;
+    QString viewId() const { return m_view.toString(); }
 
 private:
-    QString m_viewId;
-    bool m_fromState;
-    QPointer<QAbstractState> m_popupState;
+    ViewName m_view;
 };
 
 } // namespace Brisken

@@ -3,28 +3,17 @@
 #include "briskenlog.h"
 #include "viewcontroller.h"
 
-#include <QAbstractState>
-
 namespace Brisken {
 
 RequestPopup::RequestPopup(const QString &viewId, const QVariant &data)
-    : m_viewId(viewId)
-    , m_fromState(false)
+    : m_view(viewId)
     , m_data(data)
 { }
 
 RequestPopup::RequestPopup(QAbstractState *popupState, const QVariant &data)
-    : m_fromState(true)
-    , m_popupState(popupState)
+    : m_view(popupState)
     , m_data(data)
 { }
-
-QString RequestPopup::viewId() const
-{
-    if (!m_fromState)
-        return m_viewId;
-    return m_popupState ? m_popupState->objectName() : QString();
-}
 
 void RequestPopup::run() const
 {

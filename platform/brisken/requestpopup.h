@@ -1,10 +1,9 @@
 #pragma once
 
-#include <QPointer>
+#include "viewname.h"
+
 #include <QString>
 #include <QVariant>
-
-class QAbstractState;
 
 namespace Brisken {
 
@@ -20,12 +19,10 @@ public:
     void run() const;
     void operator()() const { run(); }
 
-    QString viewId() const;
+    QString viewId() const { return m_view.toString(); }
 
 private:
-    QString m_viewId;
-    bool m_fromState;
-    QPointer<QAbstractState> m_popupState;
+    ViewName m_view;
     QVariant m_data;
 };
 

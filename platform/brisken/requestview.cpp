@@ -3,14 +3,11 @@
 #include "briskenlog.h"
 #include "viewcontroller.h"
 
-#include <QAbstractState>
-
 namespace Brisken {
 
 RequestView::RequestView(const QString &viewId, const QVariant &data, bool flag,
                          const QVariant &extra)
-    : m_viewId(viewId)
-    , m_fromState(false)
+    : m_view(viewId)
     , m_data(data)
     , m_flag(flag)
     , m_extra(extra)
@@ -18,19 +15,11 @@ RequestView::RequestView(const QString &viewId, const QVariant &data, bool flag,
 
 RequestView::RequestView(QAbstractState *viewState, const QVariant &data, bool flag,
                          const QVariant &extra)
-    : m_fromState(true)
-    , m_viewState(viewState)
+    : m_view(viewState)
     , m_data(data)
     , m_flag(flag)
     , m_extra(extra)
 { }
-
-QString RequestView::viewId() const
-{
-    if (!m_fromState)
-        return m_viewId;
-    return m_viewState ? m_viewState->objectName() : QString();
-}
 
 void RequestView::run() const
 {

@@ -1,10 +1,9 @@
 #pragma once
 
-#include <QPointer>
+#include "viewname.h"
+
 #include <QString>
 #include <QVariant>
-
-class QAbstractState;
 
 namespace Brisken {
 
@@ -23,12 +22,10 @@ public:
     void operator()() const { run(); }
 
     // The view requested when the request runs (empty when its state is gone).
-    QString viewId() const;
+    QString viewId() const { return m_view.toString(); }
 
 private:
-    QString m_viewId;
-    bool m_fromState;
-    QPointer<QAbstractState> m_viewState;
+    ViewName m_view;
     QVariant m_data;
     bool m_flag;
     QVariant m_extra;
