@@ -98,8 +98,8 @@ void SimulatorTest::scenarioFile_data()
 
     // Run: the closing line counts checks and failures.
     QTest::newRow("all checks pass")
-            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n")
-            << 0 << QStringLiteral(": all 2 checks passed");
+            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n") << 0
+            << QStringLiteral(": all 2 checks passed");
     QTest::newRow("one of three checks fails")
             << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
