@@ -396,12 +396,15 @@ void HmiPhoneGlobalStateHandler::incomingCall()
     }
 }
 
+// The ringing has ended, whatever ended it. A call answered on the handset may be reported
+// connected before the ringing ends, so "IncomingCall" cannot be told from "WaitingCall" by the
+// connection: "IncomingCall", which has no auto-dismiss, is always closed, "WaitingCall" as well
+// while a call is connected.
 void HmiPhoneGlobalStateHandler::incomingCallOutbound()
 {
     if (m_phoneSource->callConnected())
         m_popupManager->dismissWaitingCall();
-    else
-        m_popupManager->dismissIncomingCall();
+    m_popupManager->dismissIncomingCall();
 }
 
 void HmiPhoneGlobalStateHandler::acceptIncomingCall()
