@@ -17,16 +17,16 @@ public:
         , m_value(value)
     { }
 
-    static QEvent::Type eventType()
-    {
-        static const int type = QEvent::registerEventType();
-        return static_cast<QEvent::Type>(type);
-    }
+    // Registered once, when the framework's library is loaded: the framework and every module
+    // read the same value, and a test of an event's type is one comparison.
+    static QEvent::Type eventType() { return s_type; }
 
     QString name() const { return m_name; }
     QVariant value() const { return m_value; }
 
 private:
+    static const QEvent::Type s_type;
+
     QString m_name;
     QVariant m_value;
 };
