@@ -14,6 +14,7 @@
 #include <mavrosk/multidplistmodel.h>
 #include <quorvel/hmievent.h>
 #include <quorvel/hmistate.h>
+#include <quorvel/hmiviewstate.h>
 #include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
 #include <taldris/hmimoduleintegration.h>
@@ -323,7 +324,9 @@ void ScenarioRunner::apply(const ScenarioStep &step)
         else if (what == QLatin1String("home"))
             m_host->openHome();
         else if (what == QLatin1String("settings") && m_host->settings())
-            Quorvel::StateMachine::instance()->goToState(m_host->settings());
+            m_host->openSettings();
+        else if (what.startsWith(QLatin1String("settings/")))
+            chooseSettingsEntry(what.section(QLatin1Char('/'), 1), step.line);
         else
             fail(step.line, QStringLiteral("the menu bar opens phone, home or settings"));
         break;
@@ -361,6 +364,17 @@ void ScenarioRunner::apply(const ScenarioStep &step)
     default:
         break;
     }
+}
+
+void ScenarioRunner::chooseSettingsEntry(const QString &entry, int line)
+{
+    // The driver opens the settings menu (unless it is on screen) and taps the entry.
+    if (Brisken::ViewController::instance()->activeView() != m_host->settingsMenu()->targetView()) {
+        m_host->openSettings();
+        m_clock->runUntilIdle();
+    }
+    if (!m_host->chooseSettingsEntry(entry))
+        fail(line, QStringLiteral("the settings menu has no entry %1").arg(entry));
 }
 
 void ScenarioRunner::check(const ScenarioStep &step, bool negated)

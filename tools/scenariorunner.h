@@ -57,6 +57,8 @@ private:
     void apply(const ScenarioStep &step);
     void check(const ScenarioStep &step, bool negated);
     void fail(int line, const QString &message);
+    // {"open": "settings/<entry>"}: the settings menu's entry, chosen as the driver would.
+    void chooseSettingsEntry(const QString &entry, int line);
 
     // A value by dotted name ("phone.status", "host.displayContext", "controller.x").
     QObject *objectFor(const QString &prefix) const;
