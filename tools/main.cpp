@@ -7,6 +7,7 @@
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#include "window/headunitwindow.h"
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -20,7 +21,9 @@
 #include <QTextStream>
 
 #include <cstdio>
+#include <cstring>
 #include <iostream>
+#include <memory>
 #include <string>
 
 #ifndef HMIPHONE_PLUGIN_FILE
@@ -68,6 +71,22 @@ void createBridge()
     Mavrosk::ArdelSource::instance();
 }
 
+enum class Display { None, Window, Screenshots };
+
+// Read before the application exists: a window needs a GUI application, and on screen the
+// platform's own event loop.
+Display displayOf(int argc, char *argv[])
+{
+    Display display = Display::None;
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--window") == 0)
+            display = Display::Window;
+        else if (std::strncmp(argv[i], "--screenshots", 13) == 0)
+            display = Display::Screenshots;
+    }
+    return display;
+}
+
 void printError(const QString &message)
 {
     std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
@@ -77,9 +96,25 @@ void printError(const QString &message)
 
 int main(int argc, char *argv[])
 {
+    const Display display = displayOf(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
-    QCoreApplication::setEventDispatcher(clock);
-    QCoreApplication app(argc, argv);
+    std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
+    if (display == Display::Window) {
+        // A window on screen runs the platform's event loop: the module's timers run in real
+        // time and the clock follows it.
+        realTimeClock.reset(clock);
+        clock->followRealTime();
+    } else {
+        QCoreApplication::setEventDispatcher(clock);
+    }
+    std::unique_ptr<QCoreApplication> application(
+            display == Display::None ? new QCoreApplication(argc, argv)
+                                     : Simulator::HeadUnitWindow::createApplication(
+                                               argc, argv,
+                                               display == Display::Window
+                                                       ? Simulator::HeadUnitWindow::OnScreen
+                                                       : Simulator::HeadUnitWindow::OffScreen));
+    QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
 
     QCommandLineParser parser;
@@ -111,13 +146,30 @@ int main(int argc, char *argv[])
             QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
                            "critical or none (default: debug)."),
             QStringLiteral("level"), QStringLiteral("debug"));
-    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption});
+    const QCommandLineOption windowOption(
+            QStringLiteral("window"),
+            QStringLiteral("Show the head unit in a window: its display, the car's keys and the "
+                           "phone's side to press, the trace; play, pause and step through the "
+                           "scenario, if one is given. Time runs in real time."));
+    const QCommandLineOption screenshotsOption(
+            QStringLiteral("screenshots"),
+            QStringLiteral("Play the scenario off screen (no display needed) and write a picture "
+                           "of the display to the directory after each step that changes it, "
+                           "named by the step's line."),
+            QStringLiteral("directory"));
+    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
+                       windowOption, screenshotsOption});
     parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
     const QStringList positional = parser.positionalArguments();
-    if (positional.size() > 1 || (positional.isEmpty() && !interactive)) {
+    const bool scenarioOptional = display == Display::Window;
+    if (positional.size() > 1 || (positional.isEmpty() && !interactive && !scenarioOptional)) {
         printError(QStringLiteral("give one scenario file, or --interactive"));
+        return CannotRun;
+    }
+    if (display != Display::None && (interactive || positional.value(0) == QLatin1String("-"))) {
+        printError(QStringLiteral("--window and --screenshots read no steps from stdin"));
         return CannotRun;
     }
     const QString phoneMode = parser.value(phoneOption);
@@ -167,11 +219,39 @@ int main(int argc, char *argv[])
     Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
     // A scenario that starts the machine itself applies the steps before it to a machine that
     // has not started; the others start before their first step.
+    bool startDeferred = false;
     for (int i = 0; i < lines.size(); ++i) {
         Simulator::ScenarioStep step;
         if (Simulator::ScenarioStep::parse(lines.at(i), i + 1, &step)
             && step.kind == Simulator::ScenarioStep::Start)
-            runner.setStartDeferred(true);
+            startDeferred = true;
+    }
+    runner.setStartDeferred(startDeferred);
+
+    if (display != Display::None) {
+        if (!startDeferred)
+            runner.finish();
+        Simulator::HeadUnitWindow window(
+                &engine, &output, clock,
+                [&runner](const QString &text, int line) { runner.playLine(text, line); },
+                display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
+                                           : Simulator::HeadUnitWindow::OffScreen);
+        window.setScenario(lines);
+        lines.clear();
+        if (display == Display::Window) {
+            window.show();
+            app.exec();
+        } else {
+            QString error;
+            const int pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
+            if (pictures < 0) {
+                printError(error);
+                return CannotRun;
+            }
+            output.note(QStringLiteral("# %1 pictures in %2")
+                                .arg(pictures)
+                                .arg(parser.value(screenshotsOption)));
+        }
     }
 
     for (int i = 0; i < lines.size() && runner.setUpError().isEmpty(); ++i)

@@ -1,0 +1,77 @@
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <QStringList>
+
+#include <functional>
+
+class QTimer;
+
+namespace Simulator {
+
+// Plays a scenario line by line for the window: play, pause and step, one input step at a time
+// together with the checks that follow it. The driver's and the phone's actions of the window's
+// panels are played as steps too, so that the trace shows them like a scenario's.
+//
+// In real time (the window), an {"advance": N} step waits N milliseconds before it is played,
+// so that the module's timers fall due as in the car; on the virtual clock it is played at once.
+class ScenarioPlayer : public QObject
+{
+    Q_OBJECT
+    Q_PROPERTY(int count READ count NOTIFY linesChanged)
+    Q_PROPERTY(int next READ next NOTIFY progressChanged)
+    Q_PROPERTY(QString nextText READ nextText NOTIFY progressChanged)
+    Q_PROPERTY(bool playing READ playing NOTIFY progressChanged)
+    Q_PROPERTY(bool waiting READ waiting NOTIFY progressChanged)
+
+public:
+    // Plays one line of text as line `line` of the scenario.
+    using PlayLine = std::function<void(const QString &text, int line)>;
+
+    ScenarioPlayer(PlayLine playLine, bool realTime, QObject *parent = nullptr);
+    ~ScenarioPlayer() override;
+
+    void setLines(const QStringList &lines);
+
+    int count() const { return m_lines.size(); }
+    int next() const { return m_next; } // index of the next line to play
+    QString nextText() const;
+    bool playing() const { return m_playing; }
+    bool waiting() const;
+
+    // Plays every line left at once, on the virtual clock; `played(line)` follows each step.
+    void playAll();
+
+public slots:
+    void play();
+    void pause();
+    // Plays the next input step and the checks after it.
+    void step();
+    // A step (a JSON object) or several (an array of them) of the window's panels.
+    void input(const QString &json);
+    // A key of the car as the key source sends it: press then short press, or press, long press
+    // and release.
+    void pressKey(int key, bool longPress);
+
+signals:
+    void linesChanged();
+    void progressChanged();
+    void played(int line);
+
+private:
+    void playLine(int index);
+    void playNextStep();
+    void resume();
+
+    PlayLine m_playLine;
+    bool m_realTime;
+    QStringList m_lines;
+    int m_next = 0;
+    int m_inputs = 0;
+    bool m_playing = false;
+    QTimer *m_pace; // between steps while playing
+    QTimer *m_wait; // an advance step in real time
+};
+
+} // namespace Simulator
