@@ -5,8 +5,8 @@
 
 #include <QDebug>
 #include <QDir>
-#include <QQmlComponent>
 #include <QGuiApplication>
+#include <QQmlComponent>
 #include <QQmlContext>
 #include <QQmlEngine>
 #include <QQuickItem>
@@ -61,7 +61,8 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
     // Until the module exports its objects, the window's chrome sees them as null.
     for (const char *name : ExportedNames) {
         if (!context->contextProperty(QLatin1String(name)).isValid())
-            context->setContextProperty(QLatin1String(name), QVariant::fromValue<QObject *>(nullptr));
+            context->setContextProperty(QLatin1String(name),
+                                        QVariant::fromValue<QObject *>(nullptr));
     }
     context->setContextProperty(QStringLiteral("_headUnit"), m_screen);
     context->setContextProperty(QStringLiteral("_scenario"), m_player);

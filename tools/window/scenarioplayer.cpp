@@ -95,7 +95,8 @@ void ScenarioPlayer::step()
         emit progressChanged();
         return;
     }
-    const qint64 advance = stepObject(m_lines.at(m_next)).value(QLatin1String("advance")).toDouble();
+    const qint64 advance
+            = stepObject(m_lines.at(m_next)).value(QLatin1String("advance")).toDouble();
     if (m_realTime && advance > 0) {
         m_wait->start(int(qMin<qint64>(advance, std::numeric_limits<int>::max())));
         emit progressChanged();
@@ -143,8 +144,8 @@ void ScenarioPlayer::input(const QString &json)
     const QJsonDocument document = QJsonDocument::fromJson(json.toUtf8());
     const QJsonArray steps = document.isArray() ? document.array() : QJsonArray{document.object()};
     for (const QJsonValue &value : steps) {
-        const QString text = QString::fromUtf8(
-                QJsonDocument(value.toObject()).toJson(QJsonDocument::Compact));
+        const QString text
+                = QString::fromUtf8(QJsonDocument(value.toObject()).toJson(QJsonDocument::Compact));
         m_playLine(text, FirstInputLine + m_inputs++);
     }
 }
