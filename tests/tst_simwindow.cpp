@@ -4,6 +4,7 @@
 
 #include "headunitwindow.h"
 #include "outputwriter.h"
+#include "scenarioreader.h"
 #include "scenariorunner.h"
 #include "virtualeventdispatcher.h"
 
@@ -119,7 +120,7 @@ Simulator::HeadUnitWindow *TestSimWindow::newWindow()
 {
     auto *window = new Simulator::HeadUnitWindow(
             m_engine, m_output, m_clock,
-            [this](const QString &text, int line) { m_runner->playLine(text, line); },
+            [this](const Simulator::ScenarioStep &step) { m_runner->play(step); },
             Simulator::HeadUnitWindow::OffScreen, this);
     window->grab();
     return window;
@@ -127,7 +128,7 @@ Simulator::HeadUnitWindow *TestSimWindow::newWindow()
 
 void TestSimWindow::play(const QString &step)
 {
-    m_runner->playLine(step, ++m_line);
+    m_runner->play(Simulator::ScenarioStep::parse(step.toUtf8(), ++m_line));
 }
 
 void TestSimWindow::popupFollowsTheTrace()
@@ -135,7 +136,9 @@ void TestSimWindow::popupFollowsTheTrace()
     QFile file(QStringLiteral(HMIPHONE_EXAMPLES_DIR "/incoming-call.jsonl"));
     QVERIFY(file.open(QIODevice::ReadOnly | QIODevice::Text));
     QScopedPointer<Simulator::HeadUnitWindow> window(newWindow());
-    window->setScenario(QString::fromUtf8(file.readAll()).split(QLatin1Char('\n')));
+    const QList<Simulator::ScenarioStep> steps = Simulator::ScenarioReader::read(file.readAll());
+    QVERIFY(Simulator::ScenarioReader::errors(steps, m_runner->controller()).isEmpty());
+    window->setScenario(steps);
 
     // The trace says which popups are shown; the display must draw just those after each line.
     QStringList traced;

@@ -3,6 +3,7 @@
 // the phone, on a virtual clock.
 
 #include "outputwriter.h"
+#include "scenarioreader.h"
 #include "scenariorunner.h"
 #include "scenariostep.h"
 #include "simulatedphone.h"
@@ -20,6 +21,7 @@
 #include <QQmlEngine>
 #include <QTextStream>
 
+#include <algorithm>
 #include <cstdio>
 #include <cstring>
 #include <iostream>
@@ -108,11 +110,11 @@ int main(int argc, char *argv[])
         QCoreApplication::setEventDispatcher(clock);
     }
     std::unique_ptr<QCoreApplication> application(
-            display == Display::None
-                    ? new QCoreApplication(argc, argv)
-                    : Simulator::HeadUnitWindow::createApplication(
-                            argc, argv,
-                            display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
+            display == Display::None ? new QCoreApplication(argc, argv)
+                                     : Simulator::HeadUnitWindow::createApplication(
+                                               argc, argv,
+                                               display == Display::Window
+                                                       ? Simulator::HeadUnitWindow::OnScreen
                                                        : Simulator::HeadUnitWindow::OffScreen));
     QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
@@ -163,8 +165,8 @@ int main(int argc, char *argv[])
 
     const bool interactive = parser.isSet(interactiveOption);
     const QStringList positional = parser.positionalArguments();
-    const bool scenarioOptional = display == Display::Window;
-    if (positional.size() > 1 || (positional.isEmpty() && !interactive && !scenarioOptional)) {
+    if (positional.size() > 1
+        || (positional.isEmpty() && !interactive && display != Display::Window)) {
         printError(QStringLiteral("give one scenario file, or --interactive"));
         return CannotRun;
     }
@@ -183,18 +185,25 @@ int main(int argc, char *argv[])
         return CannotRun;
     }
 
-    QStringList lines;
+    QByteArray text;
     QString scenarioName = QStringLiteral("stdin");
     if (!positional.isEmpty() && positional.first() != QLatin1String("-")) {
         scenarioName = positional.first();
         QFile file(scenarioName);
-        if (!file.open(QIODevice::ReadOnly | QIODevice::Text)) {
+        if (!file.open(QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read %1: %2").arg(scenarioName, file.errorString()));
             return CannotRun;
         }
-        lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+        text = file.readAll();
+    } else if (!interactive && display == Display::None) {
+        QFile input;
+        if (!input.open(stdin, QIODevice::ReadOnly)) {
+            printError(QStringLiteral("cannot read stdin"));
+            return CannotRun;
+        }
+        text = input.readAll();
     }
-    const bool readStdin = interactive || positional.value(0) == QLatin1String("-");
+    const QList<Simulator::ScenarioStep> steps = Simulator::ScenarioReader::read(text);
 
     Simulator::OutputWriter output(clock,
                                    parser.isSet(jsonOption) ? Simulator::OutputWriter::Json
@@ -216,28 +225,45 @@ int main(int argc, char *argv[])
         phone->connectPhone();
     }
 
+    // The whole scenario is read and checked against the hosted module before any step runs.
     Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
-    // A scenario that starts the machine itself applies the steps before it to a machine that
-    // has not started; the others start before their first step.
-    bool startDeferred = false;
-    for (int i = 0; i < lines.size(); ++i) {
-        Simulator::ScenarioStep step;
-        if (Simulator::ScenarioStep::parse(lines.at(i), i + 1, &step)
-            && step.kind == Simulator::ScenarioStep::Start)
-            startDeferred = true;
+    const QList<Simulator::ScenarioError> errors = runner.prepare(steps);
+    if (!runner.setUpError().isEmpty()) {
+        printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
+        return CannotRun;
     }
-    runner.setStartDeferred(startDeferred);
+    if (!errors.isEmpty()) {
+        for (const Simulator::ScenarioError &error : errors)
+            printError(QStringLiteral("%1:%2: %3")
+                               .arg(scenarioName)
+                               .arg(error.line)
+                               .arg(error.message));
+        printError(QStringLiteral("%1: %2 of %3 lines cannot run; nothing was run")
+                           .arg(scenarioName)
+                           .arg(errors.size())
+                           .arg(steps.size()));
+        return CannotRun;
+    }
 
     if (display != Display::None) {
-        if (!startDeferred)
+        // Steps of the window's panels are checked as they come, like typed ones.
+        auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (error.isEmpty())
+                runner.play(step);
+            else
+                output.note(QStringLiteral("# %1 cannot run: %2").arg(step.text, error));
+        };
+        // The window draws the module's screens from the start, unless the scenario starts it.
+        if (std::none_of(steps.begin(), steps.end(), [](const Simulator::ScenarioStep &step) {
+                return step.kind == Simulator::ScenarioStep::Start;
+            }))
             runner.finish();
-        Simulator::HeadUnitWindow window(
-                &engine, &output, clock,
-                [&runner](const QString &text, int line) { runner.playLine(text, line); },
-                display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
-                                           : Simulator::HeadUnitWindow::OffScreen);
-        window.setScenario(lines);
-        lines.clear();
+        Simulator::HeadUnitWindow window(&engine, &output, clock, play,
+                                         display == Display::Window
+                                                 ? Simulator::HeadUnitWindow::OnScreen
+                                                 : Simulator::HeadUnitWindow::OffScreen);
+        window.setScenario(steps);
         if (display == Display::Window) {
             window.show();
             app.exec();
@@ -252,39 +278,62 @@ int main(int argc, char *argv[])
                                 .arg(pictures)
                                 .arg(parser.value(screenshotsOption)));
         }
+    } else {
+        for (const Simulator::ScenarioStep &step : steps)
+            runner.play(step);
     }
-
-    for (int i = 0; i < lines.size() && runner.setUpError().isEmpty(); ++i)
-        runner.playLine(lines.at(i), i + 1);
-    if (readStdin) {
-        std::string text;
-        for (int line = 1; runner.setUpError().isEmpty() && std::getline(std::cin, text); ++line)
-            runner.playLine(QString::fromStdString(text), line);
+    int refused = 0;
+    if (interactive) {
+        // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot
+        // run is refused on its own.
+        std::string typed;
+        for (int line = 1; std::getline(std::cin, typed); ++line) {
+            Simulator::ScenarioStep step
+                    = Simulator::ScenarioStep::parse(QByteArray::fromStdString(typed), line);
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (!error.isEmpty()) {
+                printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
+                ++refused;
+                continue;
+            }
+            runner.play(step);
+        }
     }
-    if (runner.setUpError().isEmpty())
-        runner.finish();
+    runner.finish();
     if (!runner.setUpError().isEmpty()) {
         printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
         return CannotRun;
     }
 
-    if (runner.failures() > 0) {
+    if (runner.failures() > 0 || runner.stepErrors() > 0) {
         QStringList failedLines;
         for (int line : runner.failedLines())
             failedLines.append(QString::number(line));
-        printError(QStringLiteral("%1: %2 of %3 checks failed (%4 %5)")
-                           .arg(scenarioName)
-                           .arg(runner.failures())
-                           .arg(runner.checks())
-                           .arg(failedLines.size() == 1 ? QStringLiteral("line")
-                                                        : QStringLiteral("lines"))
-                           .arg(failedLines.join(QStringLiteral(", "))));
+        QStringList counts;
+        if (runner.failures() > 0)
+            counts.append(QStringLiteral("%1 of %2 checks failed")
+                                  .arg(runner.failures())
+                                  .arg(runner.checks()));
+        if (runner.stepErrors() > 0)
+            counts.append(QStringLiteral("%1 %2 could not be applied")
+                                  .arg(runner.stepErrors())
+                                  .arg(runner.stepErrors() == 1 ? QStringLiteral("step")
+                                                                : QStringLiteral("steps")));
+        printError(QStringLiteral("%1: %2 (%3 %4)")
+                           .arg(scenarioName, counts.join(QStringLiteral(", ")),
+                                failedLines.size() == 1 ? QStringLiteral("line")
+                                                        : QStringLiteral("lines"),
+                                failedLines.join(QStringLiteral(", "))));
         return ChecksFailed;
     }
-    output.note(QStringLiteral("# %1: %2 passed")
-                        .arg(scenarioName,
-                             runner.checks() == 1
-                                     ? QStringLiteral("the one check")
-                                     : QStringLiteral("all %1 checks").arg(runner.checks())));
+    if (refused > 0)
+        return CannotRun;
+    output.note(
+            QStringLiteral("# %1: %2")
+                    .arg(scenarioName,
+                         runner.checks() == 0 ? QStringLiteral("no checks")
+                                 : runner.checks() == 1
+                                 ? QStringLiteral("the one check passed")
+                                 : QStringLiteral("all %1 checks passed").arg(runner.checks())));
     return Passed;
 }

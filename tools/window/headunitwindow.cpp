@@ -43,11 +43,11 @@ QCoreApplication *HeadUnitWindow::createApplication(int &argc, char **argv, Mode
 }
 
 HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
-                               VirtualEventDispatcher *clock, ScenarioPlayer::PlayLine playLine,
+                               VirtualEventDispatcher *clock, ScenarioPlayer::PlayStep playStep,
                                Mode mode, QObject *parent)
     : QObject(parent)
     , m_screen(new HeadUnitScreen(clock, this))
-    , m_player(new ScenarioPlayer(std::move(playLine), mode == OnScreen, this))
+    , m_player(new ScenarioPlayer(std::move(playStep), mode == OnScreen, this))
     , m_trace(new QStringListModel(this))
 {
     initWindowResources();
@@ -101,9 +101,9 @@ HeadUnitWindow::~HeadUnitWindow()
     delete m_window;
 }
 
-void HeadUnitWindow::setScenario(const QStringList &lines)
+void HeadUnitWindow::setScenario(const QList<ScenarioStep> &steps)
 {
-    m_player->setLines(lines);
+    m_player->setSteps(steps);
 }
 
 void HeadUnitWindow::show()

@@ -5,7 +5,6 @@
 #include <QImage>
 #include <QObject>
 #include <QString>
-#include <QStringList>
 
 class QCoreApplication;
 class QQmlEngine;
@@ -36,10 +35,10 @@ public:
 
     // `engine` is the one the module exports its objects to.
     HeadUnitWindow(QQmlEngine *engine, OutputWriter *output, VirtualEventDispatcher *clock,
-                   ScenarioPlayer::PlayLine playLine, Mode mode, QObject *parent = nullptr);
+                   ScenarioPlayer::PlayStep playStep, Mode mode, QObject *parent = nullptr);
     ~HeadUnitWindow() override;
 
-    void setScenario(const QStringList &lines);
+    void setScenario(const QList<ScenarioStep> &steps);
     void show();
 
     // Plays the whole scenario and writes a picture of the display after each step that changes

@@ -14,29 +14,17 @@ namespace {
 constexpr int PlayPace = 700; // ms between two steps while playing
 constexpr int FirstInputLine = 10001; // the panels' steps are numbered after any scenario
 
-QJsonObject stepObject(const QString &text)
+// Checks and comments go with the input step before them.
+bool groupsWithPrevious(const ScenarioStep &step)
 {
-    const QString trimmed = text.trimmed();
-    if (trimmed.isEmpty() || trimmed.startsWith(QLatin1Char('#')))
-        return QJsonObject();
-    return QJsonDocument::fromJson(trimmed.toUtf8()).object();
-}
-
-// Checks and comments go with the step before them; everything else gives the module input.
-bool isInput(const QString &text)
-{
-    const QJsonObject object = stepObject(text);
-    if (object.isEmpty())
-        return !text.trimmed().isEmpty() && !text.trimmed().startsWith(QLatin1Char('#'));
-    return !object.contains(QLatin1String("expect"))
-            && !object.contains(QLatin1String("expect-not"));
+    return step.kind == ScenarioStep::Comment || step.isCheck();
 }
 
 } // namespace
 
-ScenarioPlayer::ScenarioPlayer(PlayLine playLine, bool realTime, QObject *parent)
+ScenarioPlayer::ScenarioPlayer(PlayStep playStep, bool realTime, QObject *parent)
     : QObject(parent)
-    , m_playLine(std::move(playLine))
+    , m_playStep(std::move(playStep))
     , m_realTime(realTime)
     , m_pace(new QTimer(this))
     , m_wait(new QTimer(this))
@@ -50,9 +38,9 @@ ScenarioPlayer::ScenarioPlayer(PlayLine playLine, bool realTime, QObject *parent
 
 ScenarioPlayer::~ScenarioPlayer() = default;
 
-void ScenarioPlayer::setLines(const QStringList &lines)
+void ScenarioPlayer::setSteps(const QList<ScenarioStep> &steps)
 {
-    m_lines = lines;
+    m_steps = steps;
     m_next = 0;
     emit linesChanged();
     emit progressChanged();
@@ -60,7 +48,7 @@ void ScenarioPlayer::setLines(const QStringList &lines)
 
 QString ScenarioPlayer::nextText() const
 {
-    return m_lines.value(m_next).trimmed();
+    return m_next < m_steps.size() ? m_steps.at(m_next).text : QString();
 }
 
 bool ScenarioPlayer::waiting() const
@@ -68,18 +56,18 @@ bool ScenarioPlayer::waiting() const
     return m_wait->isActive();
 }
 
-void ScenarioPlayer::playLine(int index)
+void ScenarioPlayer::playStep(int index)
 {
-    const QString text = m_lines.at(index).trimmed();
-    m_playLine(m_lines.at(index), index + 1);
-    if (!text.isEmpty() && !text.startsWith(QLatin1Char('#')))
-        emit played(index + 1);
+    const ScenarioStep &step = m_steps.at(index);
+    m_playStep(step);
+    if (step.kind != ScenarioStep::Comment)
+        emit played(step.line);
 }
 
 void ScenarioPlayer::playAll()
 {
-    while (m_next < m_lines.size())
-        playLine(m_next++);
+    while (m_next < m_steps.size())
+        playStep(m_next++);
     emit progressChanged();
 }
 
@@ -87,16 +75,17 @@ void ScenarioPlayer::step()
 {
     if (waiting())
         return;
-    // Comments and blank lines up to the next input step are only echoed.
-    while (m_next < m_lines.size() && !isInput(m_lines.at(m_next)))
-        playLine(m_next++);
-    if (m_next >= m_lines.size()) {
+    // Comments, and checks before any input, up to the next input step.
+    while (m_next < m_steps.size() && groupsWithPrevious(m_steps.at(m_next)))
+        playStep(m_next++);
+    if (m_next >= m_steps.size()) {
         m_playing = false;
         emit progressChanged();
         return;
     }
+    const ScenarioStep &next = m_steps.at(m_next);
     const qint64 advance
-            = stepObject(m_lines.at(m_next)).value(QLatin1String("advance")).toDouble();
+            = next.kind == ScenarioStep::Advance ? qint64(next.value("advance").toDouble()) : 0;
     if (m_realTime && advance > 0) {
         m_wait->start(int(qMin<qint64>(advance, std::numeric_limits<int>::max())));
         emit progressChanged();
@@ -107,10 +96,10 @@ void ScenarioPlayer::step()
 
 void ScenarioPlayer::playNextStep()
 {
-    playLine(m_next++);
-    while (m_next < m_lines.size() && !isInput(m_lines.at(m_next)))
-        playLine(m_next++);
-    if (m_next >= m_lines.size())
+    playStep(m_next++);
+    while (m_next < m_steps.size() && groupsWithPrevious(m_steps.at(m_next)))
+        playStep(m_next++);
+    if (m_next >= m_steps.size())
         m_playing = false;
     emit progressChanged();
     resume();
@@ -118,13 +107,13 @@ void ScenarioPlayer::playNextStep()
 
 void ScenarioPlayer::resume()
 {
-    if (m_playing && m_next < m_lines.size())
+    if (m_playing && m_next < m_steps.size())
         m_pace->start();
 }
 
 void ScenarioPlayer::play()
 {
-    if (m_playing || m_next >= m_lines.size())
+    if (m_playing || m_next >= m_steps.size())
         return;
     m_playing = true;
     emit progressChanged();

@@ -1,8 +1,10 @@
 #pragma once
 
+#include "scenariostep.h"
+
+#include <QList>
 #include <QObject>
 #include <QString>
-#include <QStringList>
 
 #include <functional>
 
@@ -26,21 +28,21 @@ class ScenarioPlayer : public QObject
     Q_PROPERTY(bool waiting READ waiting NOTIFY progressChanged)
 
 public:
-    // Plays one line of text as line `line` of the scenario.
-    using PlayLine = std::function<void(const QString &text, int line)>;
+    // Plays one step (of the scenario, or of the panels: those are not checked yet).
+    using PlayStep = std::function<void(const ScenarioStep &step)>;
 
-    ScenarioPlayer(PlayLine playLine, bool realTime, QObject *parent = nullptr);
+    ScenarioPlayer(PlayStep playStep, bool realTime, QObject *parent = nullptr);
     ~ScenarioPlayer() override;
 
-    void setLines(const QStringList &lines);
+    void setSteps(const QList<ScenarioStep> &steps);
 
-    int count() const { return m_lines.size(); }
-    int next() const { return m_next; } // index of the next line to play
+    int count() const { return m_steps.size(); }
+    int next() const { return m_next; } // index of the next step to play
     QString nextText() const;
     bool playing() const { return m_playing; }
     bool waiting() const;
 
-    // Plays every line left at once, on the virtual clock; `played(line)` follows each step.
+    // Plays every step left at once, on the virtual clock; `played(line)` follows each one.
     void playAll();
 
 public slots:
@@ -60,13 +62,13 @@ signals:
     void played(int line);
 
 private:
-    void playLine(int index);
+    void playStep(int index);
     void playNextStep();
     void resume();
 
-    PlayLine m_playLine;
+    PlayStep m_playStep;
     bool m_realTime;
-    QStringList m_lines;
+    QList<ScenarioStep> m_steps;
     int m_next = 0;
     int m_inputs = 0;
     bool m_playing = false;
