@@ -110,11 +110,11 @@ int main(int argc, char *argv[])
         QCoreApplication::setEventDispatcher(clock);
     }
     std::unique_ptr<QCoreApplication> application(
-            display == Display::None ? new QCoreApplication(argc, argv)
-                                     : Simulator::HeadUnitWindow::createApplication(
-                                               argc, argv,
-                                               display == Display::Window
-                                                       ? Simulator::HeadUnitWindow::OnScreen
+            display == Display::None
+                    ? new QCoreApplication(argc, argv)
+                    : Simulator::HeadUnitWindow::createApplication(
+                            argc, argv,
+                            display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
                                                        : Simulator::HeadUnitWindow::OffScreen));
     QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));

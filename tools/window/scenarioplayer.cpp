@@ -133,9 +133,8 @@ void ScenarioPlayer::input(const QString &json)
     const QJsonDocument document = QJsonDocument::fromJson(json.toUtf8());
     const QJsonArray steps = document.isArray() ? document.array() : QJsonArray{document.object()};
     for (const QJsonValue &value : steps) {
-        const QString text
-                = QString::fromUtf8(QJsonDocument(value.toObject()).toJson(QJsonDocument::Compact));
-        m_playLine(text, FirstInputLine + m_inputs++);
+        const QByteArray text = QJsonDocument(value.toObject()).toJson(QJsonDocument::Compact);
+        m_playStep(ScenarioStep::parse(text, FirstInputLine + m_inputs++));
     }
 }
 
