@@ -138,7 +138,7 @@ void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
     if (!m_bluetoothSource->deviceConnected())
         return;
     allow(m_batteryLevelTransition,
-          m_phoneSource->lowBatteryNotification()
+          m_phoneSource->lowBatteryNotification() && m_controller
                   && m_controller->shouldBatteryWarningBeShown(
                           m_phoneSource->deviceBatteryLevel()));
 }
