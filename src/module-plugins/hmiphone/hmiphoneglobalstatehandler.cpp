@@ -186,6 +186,7 @@ void HmiPhoneGlobalStateHandler::produceGlobalStateAndTransitions(Phone_Cmp *pho
     // [adding a phone, the pairing request] Calls, from ringing to end.
     createCallTransitions(phoneCmp);
     // [key transitions]
+    createKeyTransitions(phoneCmp); // TEMPORARY
     // Roaming confirmation, status alerts and making a call [with battery, text-message requests,
     // transfer to the handset, link loss, new messages, replying and sending in between].
     createCallRequestTransitions(phoneCmp);

@@ -1,0 +1,296 @@
+// What the phone keys do in each call situation: accept, reject, end or swap calls, or hand the
+// key back to the platform's seek function when the phone has no use for it.
+
+#include "hmiphoneglobalstatehandler.h"
+
+#include "hmiphonecontroller.h"
+#include "hmiphoneviews.h"
+
+#include <brisken/viewcontroller.h>
+#include <mavrosk/eaphonesource.h>
+#include <mavrosk/phonesource.h>
+#include <taldris/hardkeycontroller.h>
+
+namespace HmiPhone {
+
+namespace {
+
+using FallBack = void (Taldris::HardKeyController::*)();
+
+// While the phone's accessory channel blocks events, the accept, reject, end and seek keys do
+// nothing at all.
+bool eventsBlocked()
+{
+    return Mavrosk::EAPhoneSource::instance()->eventsBlocked();
+}
+
+// A second call rings while one is connected.
+bool waitingCall(const Mavrosk::PhoneSource *phone)
+{
+    return phone->incomingCall() && phone->status() == 7;
+}
+
+// A call the driver may end with a key: private mode hands the call to the handset.
+bool callActivity(const Mavrosk::PhoneSource *phone)
+{
+    return !phone->privateMode() && (phone->dialingInProgress() || phone->callConnected());
+}
+
+bool twoCalls(const Mavrosk::PhoneSource *phone)
+{
+    return phone->status() == 9 || phone->status() == 10;
+}
+
+// Long presses and their releases are not stopped by blocked events: while a call is being set up
+// or is connected (outside private mode) the phone owns the key, otherwise the platform seeks.
+void seekLongKey(const Mavrosk::PhoneSource *phone, Taldris::HardKeyController *hardKeys,
+                 FallBack fallBack)
+{
+    const int status = phone->status();
+    if (status >= 3 && status <= 11 && !phone->privateMode())
+        return;
+    (hardKeys->*fallBack)();
+}
+
+} // namespace
+
+void HmiPhoneGlobalStateHandler::processAcceptOrSeek()
+{
+    if (eventsBlocked())
+        return;
+    if (waitingCall(m_phoneSource)) {
+        m_controller->acceptWaitingCall();
+    } else if (m_phoneSource->incomingCall()) {
+        m_controller->acceptIncomingCall();
+    } else if (!m_phoneSource->privateMode() && m_phoneSource->callConnected()) {
+        if (twoCalls(m_phoneSource))
+            m_phoneSource->swapCall();
+    } else {
+        m_hardKeyController->processCombinedSeekLeftKey();
+    }
+}
+
+void HmiPhoneGlobalStateHandler::processRejectOrSeek()
+{
+    if (eventsBlocked())
+        return;
+    if (waitingCall(m_phoneSource))
+        m_controller->rejectWaitingCall();
+    else if (m_phoneSource->incomingCall())
+        m_controller->rejectIncomingCall();
+    else if (callActivity(m_phoneSource))
+        m_phoneSource->endCall();
+    else
+        m_hardKeyController->processCombinedSeekRightKey();
+}
+
+// The send key never seeks: with nothing to accept or swap it is dropped.
+void HmiPhoneGlobalStateHandler::processPhoneSendAcceptKey()
+{
+    if (eventsBlocked())
+        return;
+    if (waitingCall(m_phoneSource))
+        m_controller->acceptWaitingCall();
+    else if (m_phoneSource->incomingCall())
+        m_controller->acceptIncomingCall();
+    else if (!m_phoneSource->privateMode() && twoCalls(m_phoneSource))
+        m_phoneSource->swapCall();
+}
+
+// The end key with no call at all opens the phone screens.
+void HmiPhoneGlobalStateHandler::processPhoneEndRejectKey()
+{
+    if (eventsBlocked())
+        return;
+    if (waitingCall(m_phoneSource))
+        m_controller->rejectWaitingCall();
+    else if (m_phoneSource->incomingCall())
+        m_controller->rejectIncomingCall();
+    else if (m_phoneSource->privateMode())
+        return;
+    else if (m_phoneSource->dialingInProgress() || m_phoneSource->callConnected())
+        m_phoneSource->endCall();
+    else if (m_phoneSource->status() == 0)
+        m_controller->jumpToPhoneSection();
+}
+
+void HmiPhoneGlobalStateHandler::processRejectKeyPhone()
+{
+    if (!eventsBlocked())
+        m_phoneSource->endCall();
+}
+
+// Its guard already asked for two calls outside private mode.
+void HmiPhoneGlobalStateHandler::processMultipartySinglePressPhone()
+{
+    m_phoneSource->swapCall();
+}
+
+void HmiPhoneGlobalStateHandler::processSWCAcceptOrSeek()
+{
+    if (eventsBlocked())
+        return;
+    if (waitingCall(m_phoneSource)) {
+        m_controller->acceptWaitingCall();
+        // The accept is a posted event that only the open popup takes: close the popup after the
+        // machine has handled it, or the accept would be lost.
+        Brisken::ViewController *viewController = m_viewController;
+        QMetaObject::invokeMethod(
+                viewController,
+                [viewController] { viewController->dismissPopup(Views::WaitingCall); },
+                Qt::QueuedConnection);
+    } else if (m_phoneSource->incomingCall()) {
+        m_controller->acceptIncomingCall();
+    } else if (!m_phoneSource->privateMode() && m_phoneSource->callConnected()) {
+        if (twoCalls(m_phoneSource))
+            m_phoneSource->swapCall();
+    } else {
+        m_hardKeyController->processSWCSeekDownShortPress();
+    }
+}
+
+void HmiPhoneGlobalStateHandler::processSWCRejectOrSeek()
+{
+    if (eventsBlocked())
+        return;
+    if (m_phoneSource->incomingCall())
+        m_controller->rejectIncomingCall();
+    else if (callActivity(m_phoneSource))
+        m_phoneSource->endCall();
+    else
+        m_hardKeyController->processSWCSeekUpShortPress();
+}
+
+void HmiPhoneGlobalStateHandler::processSWCAcceptOrSeekLongPress()
+{
+    seekLongKey(m_phoneSource, m_hardKeyController,
+                &Taldris::HardKeyController::processSWCSeekDownLongPress);
+}
+
+void HmiPhoneGlobalStateHandler::processSWCAcceptOrSeekLongRelease()
+{
+    seekLongKey(m_phoneSource, m_hardKeyController,
+                &Taldris::HardKeyController::processSWCSeekDownLongRelease);
+}
+
+void HmiPhoneGlobalStateHandler::processSWCRejectOrSeekLongPress()
+{
+    if (callActivity(m_phoneSource))
+        m_phoneSource->endCall();
+    seekLongKey(m_phoneSource, m_hardKeyController,
+                &Taldris::HardKeyController::processSWCSeekUpLongPress);
+}
+
+void HmiPhoneGlobalStateHandler::processSWCRejectOrSeekLongRelease()
+{
+    seekLongKey(m_phoneSource, m_hardKeyController,
+                &Taldris::HardKeyController::processSWCSeekUpLongRelease);
+}
+
+} // namespace HmiPhone
+
+// TEMPORARY until the chart lands: the 26 key transitions in creation order.
+#include "hmiphonepopupmanager.h"
+#include "phone_cmp.h"
+#include <QEvent>
+#include <mavrosk/keysource.h>
+#include <quorvel/keysignaltransition.h>
+#include <quorvel/popupstate.h>
+namespace HmiPhone {
+void HmiPhoneGlobalStateHandler::createKeyTransitions(Phone_Cmp *phoneCmp)
+{
+    using H = HmiPhoneGlobalStateHandler;
+    using PM = HmiPhonePopupManager;
+    enum Guard { None, PhoneKey, Ringing, EndCall, Multiparty, NoProjection };
+    struct Row
+    {
+        int key, kind;
+        bool waiting;
+        Guard guard;
+        void (H::*slot)();
+        void (PM::*popupSlot)();
+        int position; // -1 none
+    };
+    const Row rows[] = {
+            {12, 2, false, PhoneKey, nullptr, nullptr, PhoneKeyOpensPhone},
+            {12, 2, false, Ringing, &H::acceptIncomingCall, &PM::dismissIncomingCall,
+             PhoneKeyAcceptsCall},
+            {12, 3, false, EndCall, &H::processRejectKeyPhone, nullptr, PhoneKeyEndsCall},
+            {12, 3, false, Ringing, &H::rejectIncomingCall, &PM::dismissIncomingCall,
+             PhoneKeyRejectsCall},
+            {12, 2, false, Multiparty, &H::processMultipartySinglePressPhone, nullptr,
+             PhoneKeyMultipartySwitch},
+            {12, 2, true, None, &H::acceptIncomingCall, &PM::dismissWaitingCall, -1},
+            {12, 3, true, None, &H::rejectIncomingCall, &PM::dismissWaitingCall, -1},
+            {77, 1, false, NoProjection, &H::processAcceptOrSeek, nullptr, AcceptOrSeekKey77Press},
+            {77, 2, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {78, 1, false, NoProjection, &H::processRejectOrSeek, nullptr, RejectOrSeekKey78Press},
+            {78, 1, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {49, 1, false, NoProjection, &H::processPhoneSendAcceptKey, nullptr, SendKey49Press},
+            {49, 2, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {50, 1, false, NoProjection, &H::processPhoneEndRejectKey, nullptr, EndKey50Press},
+            {50, 2, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {79, 1, false, NoProjection, &H::processPhoneSendAcceptKey, nullptr, SendKey79Press},
+            {79, 2, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {80, 1, false, NoProjection, &H::processPhoneEndRejectKey, nullptr, EndKey80Press},
+            {80, 2, true, None, nullptr, &PM::dismissWaitingCall, -1},
+            {90, 2, false, NoProjection, &H::processSWCAcceptOrSeek, nullptr,
+             SwcSeekDownShortPress},
+            {91, 2, true, None, &H::rejectIncomingCall, &PM::dismissWaitingCall, -1},
+            {91, 2, false, NoProjection, &H::processSWCRejectOrSeek, nullptr, SwcSeekUpShortPress},
+            {90, 3, false, NoProjection, &H::processSWCAcceptOrSeekLongPress, nullptr,
+             SwcSeekDownLongPress},
+            {90, 4, false, NoProjection, &H::processSWCAcceptOrSeekLongRelease, nullptr,
+             SwcSeekDownLongRelease},
+            {91, 3, false, NoProjection, &H::processSWCRejectOrSeekLongPress, nullptr,
+             SwcSeekUpLongPress},
+            {91, 4, false, NoProjection, &H::processSWCRejectOrSeekLongRelease, nullptr,
+             SwcSeekUpLongRelease},
+    };
+    for (const Row &row : rows) {
+        auto *t = new Quorvel::KeySignalTransition(m_keySource, "2keyEvent(int, int)", row.key,
+                                                   row.kind,
+                                                   row.waiting ? m_waitingCallPopup : nullptr);
+        switch (row.guard) {
+        case None:
+            break;
+        case PhoneKey:
+            connect(t, &Quorvel::GuardedSignalTransition::transitionTest, this,
+                    &H::phoneKeyTransitionEventTest);
+            t->setTargetState(phoneCmp);
+            m_phoneKeyTransition = t;
+            break;
+        case Ringing:
+            connect(t, &Quorvel::GuardedSignalTransition::transitionTest, this,
+                    &H::incomingCallKeySignalTransitionEventTest);
+            break;
+        case EndCall:
+            connect(t, &Quorvel::GuardedSignalTransition::transitionTest, this,
+                    &H::phoneEndCallKeyTransitionEventTest);
+            m_phoneEndCallKeyTransition = t;
+            break;
+        case Multiparty:
+            connect(t, &Quorvel::GuardedSignalTransition::transitionTest, this,
+                    &H::phoneMultipartySwitchKeyTransitionEventTest);
+            m_multipartySwitchKeyTransition = t;
+            break;
+        case NoProjection:
+            connect(t, &Quorvel::GuardedSignalTransition::transitionTest, this,
+                    &H::isProjectionNotActive);
+            break;
+        }
+        if (row.slot)
+            connect(t, &QAbstractTransition::triggered, this, row.slot);
+        if (row.popupSlot)
+            connect(t, &QAbstractTransition::triggered, HmiPhonePopupManager::instance(),
+                    row.popupSlot, row.key == 78 ? Qt::QueuedConnection : Qt::AutoConnection);
+        if (row.position >= 0) {
+            if (row.position <= SendKey79Press + 1)
+                m_rootHierarchyTransitions.append(
+                        qMakePair(Quorvel::StateLevel3, static_cast<QAbstractTransition *>(t)));
+            else
+                list(ListPosition(row.position), t);
+        }
+    }
+}
+} // namespace HmiPhone
