@@ -41,6 +41,41 @@ bool twoCalls(const Mavrosk::PhoneSource *phone)
     return phone->status() == 9 || phone->status() == 10;
 }
 
+// The accept and reject keys answer a waiting call, then a ringing one, through the controller;
+// true when the key was used for that.
+bool answer(const Mavrosk::PhoneSource *phone, HmiPhoneController *controller, bool accept)
+{
+    if (waitingCall(phone)) {
+        if (accept)
+            controller->acceptWaitingCall();
+        else
+            controller->rejectWaitingCall();
+    } else if (phone->incomingCall()) {
+        if (accept)
+            controller->acceptIncomingCall();
+        else
+            controller->rejectIncomingCall();
+    } else {
+        return false;
+    }
+    return true;
+}
+
+// The combined and steering-wheel accept keys: answer, swap two calls, keep the key during a
+// single call, or seek when the phone has no call of its own (or private mode has it).
+void acceptOrSeek(Mavrosk::PhoneSource *phone, HmiPhoneController *controller,
+                  Taldris::HardKeyController *hardKeys, FallBack fallBack)
+{
+    if (answer(phone, controller, true))
+        return;
+    if (!phone->privateMode() && phone->callConnected()) {
+        if (twoCalls(phone))
+            phone->swapCall();
+    } else {
+        (hardKeys->*fallBack)();
+    }
+}
+
 // Long presses and their releases are not stopped by blocked events: while a call is being set up
 // or is connected (outside private mode) the phone owns the key, otherwise the platform seeks.
 void seekLongKey(const Mavrosk::PhoneSource *phone, Taldris::HardKeyController *hardKeys,
@@ -56,29 +91,16 @@ void seekLongKey(const Mavrosk::PhoneSource *phone, Taldris::HardKeyController *
 
 void HmiPhoneGlobalStateHandler::processAcceptOrSeek()
 {
-    if (eventsBlocked())
-        return;
-    if (waitingCall(m_phoneSource)) {
-        m_controller->acceptWaitingCall();
-    } else if (m_phoneSource->incomingCall()) {
-        m_controller->acceptIncomingCall();
-    } else if (!m_phoneSource->privateMode() && m_phoneSource->callConnected()) {
-        if (twoCalls(m_phoneSource))
-            m_phoneSource->swapCall();
-    } else {
-        m_hardKeyController->processCombinedSeekLeftKey();
-    }
+    if (!eventsBlocked())
+        acceptOrSeek(m_phoneSource, m_controller, m_hardKeyController,
+                     &Taldris::HardKeyController::processCombinedSeekLeftKey);
 }
 
 void HmiPhoneGlobalStateHandler::processRejectOrSeek()
 {
-    if (eventsBlocked())
+    if (eventsBlocked() || answer(m_phoneSource, m_controller, false))
         return;
-    if (waitingCall(m_phoneSource))
-        m_controller->rejectWaitingCall();
-    else if (m_phoneSource->incomingCall())
-        m_controller->rejectIncomingCall();
-    else if (callActivity(m_phoneSource))
+    if (callActivity(m_phoneSource))
         m_phoneSource->endCall();
     else
         m_hardKeyController->processCombinedSeekRightKey();
@@ -87,28 +109,19 @@ void HmiPhoneGlobalStateHandler::processRejectOrSeek()
 // The send key never seeks: with nothing to accept or swap it is dropped.
 void HmiPhoneGlobalStateHandler::processPhoneSendAcceptKey()
 {
-    if (eventsBlocked())
+    if (eventsBlocked() || answer(m_phoneSource, m_controller, true))
         return;
-    if (waitingCall(m_phoneSource))
-        m_controller->acceptWaitingCall();
-    else if (m_phoneSource->incomingCall())
-        m_controller->acceptIncomingCall();
-    else if (!m_phoneSource->privateMode() && twoCalls(m_phoneSource))
+    if (!m_phoneSource->privateMode() && twoCalls(m_phoneSource))
         m_phoneSource->swapCall();
 }
 
 // The end key with no call at all opens the phone screens.
 void HmiPhoneGlobalStateHandler::processPhoneEndRejectKey()
 {
-    if (eventsBlocked())
+    if (eventsBlocked() || answer(m_phoneSource, m_controller, false)
+        || m_phoneSource->privateMode())
         return;
-    if (waitingCall(m_phoneSource))
-        m_controller->rejectWaitingCall();
-    else if (m_phoneSource->incomingCall())
-        m_controller->rejectIncomingCall();
-    else if (m_phoneSource->privateMode())
-        return;
-    else if (m_phoneSource->dialingInProgress() || m_phoneSource->callConnected())
+    if (m_phoneSource->dialingInProgress() || m_phoneSource->callConnected())
         m_phoneSource->endCall();
     else if (m_phoneSource->status() == 0)
         m_controller->jumpToPhoneSection();
@@ -130,8 +143,10 @@ void HmiPhoneGlobalStateHandler::processSWCAcceptOrSeek()
 {
     if (eventsBlocked())
         return;
-    if (waitingCall(m_phoneSource)) {
-        m_controller->acceptWaitingCall();
+    const bool waiting = waitingCall(m_phoneSource);
+    acceptOrSeek(m_phoneSource, m_controller, m_hardKeyController,
+                 &Taldris::HardKeyController::processSWCSeekDownShortPress);
+    if (waiting) {
         // The accept is a posted event that only the open popup takes: close the popup after the
         // machine has handled it, or the accept would be lost.
         Brisken::ViewController *viewController = m_viewController;
@@ -139,13 +154,6 @@ void HmiPhoneGlobalStateHandler::processSWCAcceptOrSeek()
                 viewController,
                 [viewController] { viewController->dismissPopup(Views::WaitingCall); },
                 Qt::QueuedConnection);
-    } else if (m_phoneSource->incomingCall()) {
-        m_controller->acceptIncomingCall();
-    } else if (!m_phoneSource->privateMode() && m_phoneSource->callConnected()) {
-        if (twoCalls(m_phoneSource))
-            m_phoneSource->swapCall();
-    } else {
-        m_hardKeyController->processSWCSeekDownShortPress();
     }
 }
 
