@@ -196,4 +196,3 @@ void HmiPhoneGlobalStateHandler::processSWCRejectOrSeekLongRelease()
 }
 
 } // namespace HmiPhone
-
