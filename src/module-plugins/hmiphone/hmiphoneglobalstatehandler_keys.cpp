@@ -4,6 +4,7 @@
 #include "hmiphoneglobalstatehandler.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
 #include <brisken/viewcontroller.h>
@@ -27,7 +28,7 @@ bool eventsBlocked()
 // A second call rings while one is connected.
 bool waitingCall(const Mavrosk::PhoneSource *phone)
 {
-    return phone->incomingCall() && phone->status() == 7;
+    return phone->incomingCall() && phone->status() == CallStatus::OneCallConnected;
 }
 
 // A call the driver may end with a key: private mode hands the call to the handset.
@@ -38,7 +39,8 @@ bool callActivity(const Mavrosk::PhoneSource *phone)
 
 bool twoCalls(const Mavrosk::PhoneSource *phone)
 {
-    return phone->status() == 9 || phone->status() == 10;
+    return phone->status() == CallStatus::SwappableCallsConnected
+            || phone->status() == CallStatus::TwoCallsConnected;
 }
 
 // The accept and reject keys answer a waiting call, then a ringing one, through the controller;
@@ -82,7 +84,8 @@ void seekLongKey(const Mavrosk::PhoneSource *phone, Taldris::HardKeyController *
                  FallBack fallBack)
 {
     const int status = phone->status();
-    if (status >= 3 && status <= 11 && !phone->privateMode())
+    if (status >= CallStatus::OutgoingSetUp && status <= CallStatus::FurtherCallRefused
+        && !phone->privateMode())
         return;
     (hardKeys->*fallBack)();
 }
@@ -123,7 +126,7 @@ void HmiPhoneGlobalStateHandler::processPhoneEndRejectKey()
         return;
     if (m_phoneSource->dialingInProgress() || m_phoneSource->callConnected())
         m_phoneSource->endCall();
-    else if (m_phoneSource->status() == 0)
+    else if (m_phoneSource->status() == CallStatus::NoCall)
         m_controller->jumpToPhoneSection();
 }
 
