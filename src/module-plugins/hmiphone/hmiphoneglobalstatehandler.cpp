@@ -4,6 +4,7 @@
 #include "hmiphoneevents.h"
 #include "hmiphoneglobalchart.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 #include "phone_cmp.h"
@@ -251,6 +252,7 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     using H = HmiPhoneGlobalStateHandler;
     using PM = HmiPhonePopupManager;
     using Mavrosk::PhoneSource;
+    namespace Status = CallStatus;
     const auto L2 = Quorvel::StateLevel2;
     PhoneSource *phone = m_phoneSource;
     PM *pm = m_popupManager;
@@ -313,9 +315,9 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
 
     // The call status: dialling, entering the call screens, connected outgoing calls; only a
     // single call getting through clears a dialling failure still on screen.
-    chart.change(phone, "status", {}, 3).parallelExclusive(0)
+    chart.change(phone, "status", {}, Status::OutgoingSetUp).parallelExclusive(0)
             .run(&H::showPhoneDialingTransientMessage).list(64);
-    chart.change(phone, "status", {}, 4).parallelExclusive(0)
+    chart.change(phone, "status", {}, Status::OutgoingSetUpBesideCall).parallelExclusive(0)
             .run(&H::showPhoneDialingTransientMessage).list(65);
     chart.property(phone, "status").parallelExclusive(1).keep(m_callConnectedTransition)
             .to(phoneCmp->phoneCallCompositeState())
@@ -323,14 +325,15 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.change(phone, "callConnected", {false}, true)
             .run(Brisken::DismissPopup(Views::PhoneSmsDownloading))
             .run(Brisken::DismissPopup(Views::PhoneBookDownloading)).list(18);
-    chart.change(phone, "status", {3}, 7).parallelExclusive(0)
+    chart.change(phone, "status", {Status::OutgoingSetUp}, Status::OneCallConnected)
+            .parallelExclusive(0)
             .run(&H::showPhoneConnectedOutgoingCallTransientMessage).run(&H::hideDialingFailed).list(12);
-    chart.change(phone, "status", {4}, 9).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(13);
-    chart.change(phone, "status", {5}, 10).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(14);
-    chart.change(phone, "status", {6}, 11).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideCall}, Status::SwappableCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(13);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideTwoCalls}, Status::TwoCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(14);
+    chart.change(phone, "status", {Status::OutgoingSetUpRefusing}, Status::FurtherCallRefused)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
     chart.change(phone, "privateMode", {}, 1).run(&H::hideCallKeyPad).list(16);
 
     // ["phoneBookStatus": becomes 2, leaves 2, 2 to 1]
@@ -345,7 +348,56 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
 
     // --- Keys --------------------------------------------------------------------------------
 
-    // [the 26 key rows, in the creation order of the key table]
+    // One key event may satisfy several rows; the guards keep the always-armed ones apart. The
+    // "WaitingCall" rows listen only while that popup is open, unguarded, and add its dismissal
+    // to what the always-armed row of the same key does.
+    PM *keyPopups = HmiPhonePopupManager::instance();
+    const int Press = KeyPress::Press, Short = KeyPress::ShortPress, Long = KeyPress::LongPress,
+              Release = KeyPress::LongPressRelease;
+    const auto notProjected = &H::isProjectionNotActive;
+    PopupState *waiting = m_waitingCallPopup;
+    chart.key(Key::Phone, Short).keep(m_phoneKeyTransition)
+            .guard(&H::phoneKeyTransitionEventTest).to(phoneCmp).list(1);
+    chart.key(Key::Phone, Short).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(2);
+    chart.key(Key::Phone, Long).keep(m_phoneEndCallKeyTransition)
+            .guard(&H::phoneEndCallKeyTransitionEventTest).run(&H::processRejectKeyPhone).list(20);
+    chart.key(Key::Phone, Long).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(21);
+    chart.key(Key::Phone, Short).keep(m_multipartySwitchKeyTransition)
+            .guard(&H::phoneMultipartySwitchKeyTransitionEventTest)
+            .run(&H::processMultipartySinglePressPhone).list(31);
+    chart.key(Key::Phone, Short, waiting)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::Phone, Long, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::AcceptOrSeekLeft, Press).guard(notProjected).run(&H::processAcceptOrSeek).list(19);
+    chart.key(Key::AcceptOrSeekLeft, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::RejectOrSeekRight, Press).guard(notProjected).run(&H::processRejectOrSeek).list(22);
+    // The same press as the row above, which posts the rejection to this very popup.
+    chart.key(Key::RejectOrSeekRight, Press, waiting).runLater(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(23);
+    chart.key(Key::SendAccept, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(24);
+    chart.key(Key::EndReject, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept2, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(3);
+    chart.key(Key::SendAccept2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject2, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(4);
+    chart.key(Key::EndReject2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekDown, Short).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeek).list(25);
+    chart.key(Key::SteeringWheelSeekUp, Short, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekUp, Short).guard(notProjected)
+            .run(&H::processSWCRejectOrSeek).list(26);
+    chart.key(Key::SteeringWheelSeekDown, Long).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongPress).list(27);
+    chart.key(Key::SteeringWheelSeekDown, Release).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongRelease).list(28);
+    chart.key(Key::SteeringWheelSeekUp, Long).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongPress).list(29);
+    chart.key(Key::SteeringWheelSeekUp, Release).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongRelease).list(30);
 
     // --- Requests, messages and connection ---------------------------------------------------
 
@@ -383,7 +435,7 @@ void HmiPhoneGlobalStateHandler::incomingCall()
 {
     // A call the driver cannot take now is refused at once, without a popup or a transient.
     if (m_phoneSource->doNotDisturb() || m_phoneSource->multipleCallsConnected()
-        || m_phoneSource->status() == 11) {
+        || m_phoneSource->status() == CallStatus::FurtherCallRefused) {
         m_phoneSource->rejectIncomingCall();
         return;
     }
@@ -481,12 +533,12 @@ void HmiPhoneGlobalStateHandler::roamingCallCancelled()
 void HmiPhoneGlobalStateHandler::handleDialingFailure()
 {
     switch (m_phoneSource->status()) {
-    case 3:
-    case 4:
-    case 5:
-    case 6:
-    case 0:
-    case 1:
+    case CallStatus::OutgoingSetUp:
+    case CallStatus::OutgoingSetUpBesideCall:
+    case CallStatus::OutgoingSetUpBesideTwoCalls:
+    case CallStatus::OutgoingSetUpRefusing:
+    case CallStatus::NoCall:
+    case CallStatus::SetUpOrFailure:
         // Two failures in a row show the ordinary popup, the third the one with more help.
         if (m_dialingFailureCount > 1) {
             m_dialingFailureCount = 0;
@@ -522,14 +574,19 @@ void HmiPhoneGlobalStateHandler::onMissedCallPopupExited()
 
 void HmiPhoneGlobalStateHandler::addPhoneRequested()
 {
-    Taldris::HmiIntentManager::instance()->requestAction(14, {QVariant(ModuleName)}, false, false,
-                                                         QVariant());
+    Taldris::HmiIntentManager::instance()->requestAction(
+            IntentAction::PairPhone, {QVariant(ModuleName)}, false, false, QVariant());
 }
 
 // Posted through the controller, at normal priority, to the HMI's one machine, like every other
 // event of the module.
 void HmiPhoneGlobalStateHandler::postEvent(const QString &name)
 {
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneGlobalStateHandler: the controller is gone," << name
+                            << "not posted";
+        return;
+    }
     m_controller->postEvent(new Quorvel::HmiEvent(name, QVariant()));
 }
 
@@ -621,7 +678,8 @@ void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
 void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
 {
     m_textMessageAlertState = 0;
-    m_controller->resetRecievedTextMessageCount();
+    if (m_controller)
+        m_controller->resetRecievedTextMessageCount();
 }
 
 } // namespace HmiPhone
