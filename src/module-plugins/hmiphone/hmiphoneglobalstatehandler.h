@@ -6,6 +6,7 @@
 #include <QList>
 #include <QObject>
 #include <QPair>
+#include <QPointer>
 
 class QAbstractTransition;
 class QEvent;
@@ -104,6 +105,20 @@ private slots:
     void enableMultipleMessagesState();
     void resetAlertStateOnMultipleMessagesTimeout();
 
+    // Phone keys: what each key does in the current call situation
+    void processAcceptOrSeek();
+    void processRejectOrSeek();
+    void processPhoneSendAcceptKey();
+    void processPhoneEndRejectKey();
+    void processRejectKeyPhone();
+    void processMultipartySinglePressPhone();
+    void processSWCAcceptOrSeek();
+    void processSWCRejectOrSeek();
+    void processSWCAcceptOrSeekLongPress();
+    void processSWCAcceptOrSeekLongRelease();
+    void processSWCRejectOrSeekLongPress();
+    void processSWCRejectOrSeekLongRelease();
+
     // Guard tests: each allows or blocks the transition that asks
     void incomingCallTransitionEventTest(QEvent *event);
     void incomingCallKeySignalTransitionEventTest(QEvent *event);
@@ -144,7 +159,7 @@ private:
     void hideTransient(const QString &name);
     void postEvent(const QString &name);
 
-    HmiPhoneController *m_controller;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
     HmiPhonePopupManager *m_popupManager;
     Brisken::ViewController *m_viewController;
     Brisken::ViewManager *m_viewManager;
