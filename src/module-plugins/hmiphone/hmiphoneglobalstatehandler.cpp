@@ -704,22 +704,6 @@ void HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage()
     hideTransient(Transients::PhoneOutgoingDialing);
 }
 
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadInitiatedTransientMessage()
-{
-    requestTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::hidePhonePhonebookDownloadInitiatedTransientMessage()
-{
-    hideTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadCompleteTransientMessage()
-{
-    if (m_bluetoothSource->deviceConnected())
-        requestTransient(Transients::PhonebookDownloadComplete);
-}
-
 // --- Text-message alert bookkeeping ------------------------------------------------------------
 
 void HmiPhoneGlobalStateHandler::enableSingleMessageState()

@@ -104,6 +104,26 @@ private slots:
     void enableMultipleMessagesState();
     void resetAlertStateOnMultipleMessagesTimeout();
 
+    // Link loss and reconnection
+    void handleLinklossReconnectSuccessTransition();
+    void showPhoneAttemptingReconnectTransient();
+    void showPhoneConnectSuccessTransient();
+
+    // Extended mode: the minute countdown while "PhoneCallStandByModePopup" is concerned
+    void handleExtendedModeChangeRequest();
+    void clearExtendedModeTimer();
+    void extendedModeTimerMinuteElapsed();
+
+    // Contacts download and its retries
+    void handlePhonebookDownloadCompleteDisplay();
+    void handleRetryPhnBookDownloadContactAccess();
+    void handleRetryPhnBookAutomaticContactDownload();
+
+    // Not connected by the module; reachable through the meta-object
+    void retryPhoneBookDownload();
+    void retrySmsDownload();
+    void phoneFixHintTimeout();
+
     // Guard tests: each allows or blocks the transition that asks
     void incomingCallTransitionEventTest(QEvent *event);
     void incomingCallKeySignalTransitionEventTest(QEvent *event);
