@@ -695,6 +695,11 @@ void HmiPhoneGlobalStateHandler::addPhoneRequested()
 // event of the module.
 void HmiPhoneGlobalStateHandler::postEvent(const QString &name)
 {
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneGlobalStateHandler: the controller is gone," << name
+                            << "not posted";
+        return;
+    }
     m_controller->postEvent(new Quorvel::HmiEvent(name, QVariant()));
 }
 
@@ -770,7 +775,8 @@ void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
 void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
 {
     m_textMessageAlertState = 0;
-    m_controller->resetRecievedTextMessageCount();
+    if (m_controller)
+        m_controller->resetRecievedTextMessageCount();
 }
 
 } // namespace HmiPhone
