@@ -513,8 +513,8 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     auto voiceOn = chart.change(phone, "phoneVoiceServiceActive", {false}, true)
             .parallelExclusive(2).list(105, L2);
     auto voiceOff = chart.change(phone, "phoneVoiceServiceActive", {true}, false).list(106, L2);
-    auto menuExited = chart.signal(m_controller, &HmiPhoneController::phoneMenuExited).list(108, L2);
-    auto menuEntered = chart.signal(m_controller, &HmiPhoneController::phoneMenuEntered).list(109, L2);
+    auto menuExited = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuExited).list(108, L2);
+    auto menuEntered = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuEntered).list(109, L2);
     const QString &voiceMessage = Transients::PhoneVoiceServiceActivatedTransientMsg;
     const QString &voicePopup = Views::PhoneVoiceServiceActivatedPopup;
     if (Brisken::StatusBarController *statusBar = statusBarController()) {
