@@ -74,6 +74,11 @@ private:
         QVERIFY(host().chooseSettingsEntry(QStringLiteral("Phone")));
         processUntilIdle();
     }
+    static void back()
+    {
+        Brisken::ViewController::instance()->back(1);
+        processUntilIdle();
+    }
     static void setConnected(bool connected)
     {
         Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
@@ -177,8 +182,7 @@ void TestSettings::pages()
     QCOMPARE(screen(), shown);
     if (afterBack.isEmpty())
         return;
-    Brisken::ViewController::instance()->back(1);
-    processUntilIdle();
+    back();
     QCOMPARE(screen(), afterBack);
 }
 
@@ -222,7 +226,7 @@ void TestSettings::ringtonePreviewStops()
         setConnected(false);
     if (way == QLatin1String("back") || way == QLatin1String("disconnect")) {
         QCOMPARE(screen(), QStringLiteral("PhoneRingtoneAboutSettings"));
-        Brisken::ViewController::instance()->back(1);
+        back();
     }
     processUntilIdle();
 
@@ -261,8 +265,7 @@ void TestSettings::disconnection()
     QCOMPARE(GlobalHmi::isActive(Views::PhoneSettingsRoot), afterDisconnection != Menu);
     if (afterBack.isEmpty())
         return;
-    Brisken::ViewController::instance()->back(1);
-    processUntilIdle();
+    back();
     QCOMPARE(screen(), afterBack);
 }
 
