@@ -111,6 +111,8 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 {
     Output output{m_clock ? m_clock->now() : 0, kind, fields};
     m_outputs.append(output);
+    if (m_silent)
+        return;
     QString line;
     if (m_format == Json) {
         line = toJsonLine(output);
@@ -125,7 +127,7 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 
 void OutputWriter::note(const QString &text)
 {
-    if (m_format != Human)
+    if (m_format != Human || m_silent)
         return;
     std::fputs(text.toUtf8().constData(), m_stream);
     std::fputc('\n', m_stream);
@@ -134,7 +136,8 @@ void OutputWriter::note(const QString &text)
 
 void OutputWriter::beginInput()
 {
-    m_inputStart = m_outputs.size();
+    m_outputs.clear();
+    m_inputStart = 0;
 }
 
 QString OutputWriter::details(const Output &output)
@@ -196,7 +199,8 @@ void OutputWriter::captureLog(const QString &category, int minimumLevel)
     m_logCategory = category;
     m_logLevel = minimumLevel;
     // The module's category writes only warnings by default; the simulator shows what was asked.
-    QString rules;
+    // Silent, the platform's own chatter goes too; its warnings still reach stderr.
+    QString rules = m_silent ? QStringLiteral("*.debug=false\n*.info=false\n") : QString();
     const char *levels[] = {"debug", "info", "warning", "critical"};
     for (int level = 0; level < 4; ++level)
         rules += QStringLiteral("%1.%2=%3\n")
