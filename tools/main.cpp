@@ -10,6 +10,7 @@
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#include "window/headunitwindow.h"
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -24,7 +25,9 @@
 #include <QTemporaryFile>
 #include <QTextStream>
 
+#include <algorithm>
 #include <cstdio>
+#include <cstring>
 #include <iostream>
 #include <memory>
 #include <string>
@@ -72,6 +75,22 @@ void createBridge()
     Mavrosk::NavSource::instance();
     Mavrosk::GlobalSource::instance();
     Mavrosk::ArdelSource::instance();
+}
+
+enum class Display { None, Window, Screenshots };
+
+// Read before the application exists: a window needs a GUI application, and on screen the
+// platform's own event loop.
+Display displayOf(int argc, char *argv[])
+{
+    Display display = Display::None;
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--window") == 0)
+            display = Display::Window;
+        else if (std::strncmp(argv[i], "--screenshots", 13) == 0)
+            display = Display::Screenshots;
+    }
+    return display;
 }
 
 void printError(const QString &message)
@@ -137,9 +156,25 @@ int main(int argc, char *argv[])
 {
     // The same steps give the same run: no hash order may differ between two runs.
     qSetGlobalQHashSeed(0);
+    const Display display = displayOf(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
-    QCoreApplication::setEventDispatcher(clock);
-    QCoreApplication app(argc, argv);
+    std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
+    if (display == Display::Window) {
+        // A window on screen runs the platform's event loop: the module's timers run in real
+        // time and the clock follows it.
+        realTimeClock.reset(clock);
+        clock->followRealTime();
+    } else {
+        QCoreApplication::setEventDispatcher(clock);
+    }
+    std::unique_ptr<QCoreApplication> application(
+            display == Display::None
+                    ? new QCoreApplication(argc, argv)
+                    : Simulator::HeadUnitWindow::createApplication(
+                            argc, argv,
+                            display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
+                                                       : Simulator::HeadUnitWindow::OffScreen));
+    QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
 
     QCommandLineParser parser;
@@ -171,6 +206,17 @@ int main(int argc, char *argv[])
             QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
                            "critical or none (default: debug)."),
             QStringLiteral("level"), QStringLiteral("debug"));
+    const QCommandLineOption windowOption(
+            QStringLiteral("window"),
+            QStringLiteral("Show the head unit in a window: its display, the car's keys and the "
+                           "phone's side to press, the trace; play, pause and step through the "
+                           "scenario, if one is given. Time runs in real time."));
+    const QCommandLineOption screenshotsOption(
+            QStringLiteral("screenshots"),
+            QStringLiteral("Play the scenario off screen (no display needed) and write a picture "
+                           "of the display to the directory after each step that changes it, "
+                           "named by the step's line."),
+            QStringLiteral("directory"));
     const QCommandLineOption randomOption(
             QStringLiteral("random"),
             QStringLiteral("Play random steps from this seed instead of a scenario, checking the "
@@ -187,14 +233,16 @@ int main(int argc, char *argv[])
             QStringLiteral("check-invariants"),
             QStringLiteral("Check the soak's invariants after every step of the scenario."));
     parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
-                       randomOption, stepsOption, writeScenarioOption, invariantsOption});
+                       windowOption, screenshotsOption, randomOption, stepsOption,
+                       writeScenarioOption, invariantsOption});
     parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
     const bool random = parser.isSet(randomOption);
     const QStringList positional = parser.positionalArguments();
-    if (random ? !positional.isEmpty() || interactive
-               : positional.size() > 1 || (positional.isEmpty() && !interactive)) {
+    if (random ? !positional.isEmpty() || interactive || display != Display::None
+               : positional.size() > 1
+                        || (positional.isEmpty() && !interactive && display != Display::Window)) {
         printError(QStringLiteral("give one scenario file, or --interactive, or --random SEED"));
         return CannotRun;
     }
@@ -204,6 +252,10 @@ int main(int argc, char *argv[])
     const qint64 randomSteps = parser.value(stepsOption).toLongLong(&stepsOk);
     if (random && (!seedOk || !stepsOk || randomSteps < 0)) {
         printError(QStringLiteral("--random takes a seed from 0 to 4294967295, --steps a count"));
+        return CannotRun;
+    }
+    if (display != Display::None && (interactive || positional.value(0) == QLatin1String("-"))) {
+        printError(QStringLiteral("--window and --screenshots read no steps from stdin"));
         return CannotRun;
     }
     const QString phoneMode = parser.value(phoneOption);
@@ -229,7 +281,7 @@ int main(int argc, char *argv[])
             return CannotRun;
         }
         text = file.readAll();
-    } else if (!interactive && !random) {
+    } else if (!interactive && !random && display == Display::None) {
         QFile input;
         if (!input.open(stdin, QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read stdin"));
@@ -283,19 +335,55 @@ int main(int argc, char *argv[])
     if (random)
         return runSoak(&runner, &host, seed, randomSteps, parser.value(writeScenarioOption));
 
-    std::unique_ptr<Simulator::Invariants> invariants;
-    if (parser.isSet(invariantsOption))
-        invariants = std::make_unique<Simulator::Invariants>(&host);
-    for (const Simulator::ScenarioStep &step : steps) {
-        runner.play(step);
-        const QString violation
-                = invariants && step.isInput() ? invariants->check(runner.controller()) : QString();
-        if (!violation.isEmpty()) {
-            printError(QStringLiteral("%1:%2: invariant violated: %3")
-                               .arg(scenarioName)
-                               .arg(step.line)
-                               .arg(violation));
-            return ChecksFailed;
+    if (display != Display::None) {
+        // Steps of the window's panels are checked as they come, like typed ones.
+        auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (error.isEmpty())
+                runner.play(step);
+            else
+                output.note(QStringLiteral("# %1 cannot run: %2").arg(step.text, error));
+        };
+        // The window draws the module's screens from the start, unless the scenario starts it.
+        if (std::none_of(steps.begin(), steps.end(), [](const Simulator::ScenarioStep &step) {
+                return step.kind == Simulator::ScenarioStep::Start;
+            }))
+            runner.finish();
+        Simulator::HeadUnitWindow window(&engine, &output, clock, play,
+                                         display == Display::Window
+                                                 ? Simulator::HeadUnitWindow::OnScreen
+                                                 : Simulator::HeadUnitWindow::OffScreen);
+        window.setScenario(steps);
+        if (display == Display::Window) {
+            window.show();
+            app.exec();
+        } else {
+            QString error;
+            const int pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
+            if (pictures < 0) {
+                printError(error);
+                return CannotRun;
+            }
+            output.note(QStringLiteral("# %1 pictures in %2")
+                                .arg(pictures)
+                                .arg(parser.value(screenshotsOption)));
+        }
+    } else {
+        std::unique_ptr<Simulator::Invariants> invariants;
+        if (parser.isSet(invariantsOption))
+            invariants = std::make_unique<Simulator::Invariants>(&host);
+        for (const Simulator::ScenarioStep &step : steps) {
+            runner.play(step);
+            const QString violation = invariants && step.isInput()
+                    ? invariants->check(runner.controller())
+                    : QString();
+            if (!violation.isEmpty()) {
+                printError(QStringLiteral("%1:%2: invariant violated: %3")
+                                   .arg(scenarioName)
+                                   .arg(step.line)
+                                   .arg(violation));
+                return ChecksFailed;
+            }
         }
     }
     int refused = 0;
