@@ -720,33 +720,4 @@ void HmiPhoneGlobalStateHandler::showPhonebookDownloadCompleteTransientMessage()
         requestTransient(Transients::PhonebookDownloadComplete);
 }
 
-// --- Text-message alert bookkeeping ------------------------------------------------------------
-
-void HmiPhoneGlobalStateHandler::enableSingleMessageState()
-{
-    m_textMessageAlertState = 1;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout()
-{
-    // A state of 2 was set by the multiple-messages alert replacing this one: it stays.
-    if (m_textMessageAlertState == 1)
-        m_textMessageAlertState = 0;
-    if (m_phoneSource->hearItPressed()) {
-        m_phoneSource->requestTextMessagesInbox();
-        m_phoneSource->setHearItPressed(false);
-    }
-}
-
-void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
-{
-    m_textMessageAlertState = 2;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
-{
-    m_textMessageAlertState = 0;
-    m_controller->resetRecievedTextMessageCount();
-}
-
 } // namespace HmiPhone

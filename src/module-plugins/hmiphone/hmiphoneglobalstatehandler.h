@@ -98,11 +98,30 @@ private slots:
     void hidePhonePhonebookDownloadInitiatedTransientMessage();
     void showPhonebookDownloadCompleteTransientMessage();
 
-    // Text-message alert bookkeeping, wired to the alert popups
+    // Text messages: new-message alerts and their bookkeeping, reading aloud, replying and
+    // sending, and the checks before the message screens open
+    void processNewTextMessageAlert();
     void enableSingleMessageState();
     void resetAlertStateOnSingleMessageTimeout();
     void enableMultipleMessagesState();
     void resetAlertStateOnMultipleMessagesTimeout();
+    void hearNewTextMessageAlert();
+    void stopHearNewTextMessageAlert();
+    void hideNewTextMessageAlert();
+    void viewNewTextMessageAlert();
+    void handleSmsNewTextHearitRequest();
+    void handleListenMessageRequest();
+    void handleRequestedMessageDetailsReady();
+    void handleVRSendReplyMessage();
+    void handleSendTextMessageRequest();
+    void handleRetrySendTextMessage();
+    void handleSendTextMessageSuccess();
+    void handleSendTextMessageFailure();
+    void handleSendTextMessageNetworkFailure();
+    void handleSendMessageNoResponseFromPhone();
+    void smsCheckPrerequisites();
+    void smsCheckStatus();
+    void checkSmsStatus();
 
     // Guard tests: each allows or blocks the transition that asks
     void incomingCallTransitionEventTest(QEvent *event);
@@ -266,6 +285,8 @@ private:
     void createScreenRequestTransitions(Phone_Cmp *phoneCmp);
     void createContactsRequestTransition(Phone_Cmp *phoneCmp);
     void listCollectedTransitions(Phone_Cmp *phoneCmp);
+
+    void handleNewTextMessagesReceived();
 
     void requestTransient(const QString &name);
     void hideTransient(const QString &name);
