@@ -3,6 +3,7 @@
 // the phone, on a virtual clock.
 
 #include "outputwriter.h"
+#include "scenarioreader.h"
 #include "scenariorunner.h"
 #include "scenariostep.h"
 #include "simulatedphone.h"
@@ -131,18 +132,25 @@ int main(int argc, char *argv[])
         return CannotRun;
     }
 
-    QStringList lines;
+    QByteArray text;
     QString scenarioName = QStringLiteral("stdin");
     if (!positional.isEmpty() && positional.first() != QLatin1String("-")) {
         scenarioName = positional.first();
         QFile file(scenarioName);
-        if (!file.open(QIODevice::ReadOnly | QIODevice::Text)) {
+        if (!file.open(QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read %1: %2").arg(scenarioName, file.errorString()));
             return CannotRun;
         }
-        lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+        text = file.readAll();
+    } else if (!interactive) {
+        QFile input;
+        if (!input.open(stdin, QIODevice::ReadOnly)) {
+            printError(QStringLiteral("cannot read stdin"));
+            return CannotRun;
+        }
+        text = input.readAll();
     }
-    const bool readStdin = interactive || positional.value(0) == QLatin1String("-");
+    const QList<Simulator::ScenarioStep> steps = Simulator::ScenarioReader::read(text);
 
     Simulator::OutputWriter output(clock,
                                    parser.isSet(jsonOption) ? Simulator::OutputWriter::Json
@@ -164,47 +172,80 @@ int main(int argc, char *argv[])
         phone->connectPhone();
     }
 
+    // The whole scenario is read and checked against the hosted module before any step runs.
     Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
-    // A scenario that starts the machine itself applies the steps before it to a machine that
-    // has not started; the others start before their first step.
-    for (int i = 0; i < lines.size(); ++i) {
-        Simulator::ScenarioStep step;
-        if (Simulator::ScenarioStep::parse(lines.at(i), i + 1, &step)
-            && step.kind == Simulator::ScenarioStep::Start)
-            runner.setStartDeferred(true);
+    const QList<Simulator::ScenarioError> errors = runner.prepare(steps);
+    if (!runner.setUpError().isEmpty()) {
+        printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
+        return CannotRun;
+    }
+    if (!errors.isEmpty()) {
+        for (const Simulator::ScenarioError &error : errors)
+            printError(QStringLiteral("%1:%2: %3")
+                               .arg(scenarioName)
+                               .arg(error.line)
+                               .arg(error.message));
+        printError(QStringLiteral("%1: %2 of %3 lines cannot run; nothing was run")
+                           .arg(scenarioName)
+                           .arg(errors.size())
+                           .arg(steps.size()));
+        return CannotRun;
     }
 
-    for (int i = 0; i < lines.size() && runner.setUpError().isEmpty(); ++i)
-        runner.playLine(lines.at(i), i + 1);
-    if (readStdin) {
-        std::string text;
-        for (int line = 1; runner.setUpError().isEmpty() && std::getline(std::cin, text); ++line)
-            runner.playLine(QString::fromStdString(text), line);
+    for (const Simulator::ScenarioStep &step : steps)
+        runner.play(step);
+    int refused = 0;
+    if (interactive) {
+        // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot
+        // run is refused on its own.
+        std::string typed;
+        for (int line = 1; std::getline(std::cin, typed); ++line) {
+            Simulator::ScenarioStep step
+                    = Simulator::ScenarioStep::parse(QByteArray::fromStdString(typed), line);
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (!error.isEmpty()) {
+                printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
+                ++refused;
+                continue;
+            }
+            runner.play(step);
+        }
     }
-    if (runner.setUpError().isEmpty())
-        runner.finish();
+    runner.finish();
     if (!runner.setUpError().isEmpty()) {
         printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
         return CannotRun;
     }
 
-    if (runner.failures() > 0) {
+    if (runner.failures() > 0 || runner.stepErrors() > 0) {
         QStringList failedLines;
         for (int line : runner.failedLines())
             failedLines.append(QString::number(line));
-        printError(QStringLiteral("%1: %2 of %3 checks failed (%4 %5)")
-                           .arg(scenarioName)
-                           .arg(runner.failures())
-                           .arg(runner.checks())
-                           .arg(failedLines.size() == 1 ? QStringLiteral("line")
-                                                        : QStringLiteral("lines"))
-                           .arg(failedLines.join(QStringLiteral(", "))));
+        QStringList counts;
+        if (runner.failures() > 0)
+            counts.append(QStringLiteral("%1 of %2 checks failed")
+                                  .arg(runner.failures())
+                                  .arg(runner.checks()));
+        if (runner.stepErrors() > 0)
+            counts.append(QStringLiteral("%1 %2 could not be applied")
+                                  .arg(runner.stepErrors())
+                                  .arg(runner.stepErrors() == 1 ? QStringLiteral("step")
+                                                                : QStringLiteral("steps")));
+        printError(QStringLiteral("%1: %2 (%3 %4)")
+                           .arg(scenarioName, counts.join(QStringLiteral(", ")),
+                                failedLines.size() == 1 ? QStringLiteral("line")
+                                                        : QStringLiteral("lines"),
+                                failedLines.join(QStringLiteral(", "))));
         return ChecksFailed;
     }
-    output.note(QStringLiteral("# %1: %2 passed")
-                        .arg(scenarioName,
-                             runner.checks() == 1
-                                     ? QStringLiteral("the one check")
-                                     : QStringLiteral("all %1 checks").arg(runner.checks())));
+    if (refused > 0)
+        return CannotRun;
+    output.note(
+            QStringLiteral("# %1: %2")
+                    .arg(scenarioName,
+                         runner.checks() == 0 ? QStringLiteral("no checks")
+                                 : runner.checks() == 1
+                                 ? QStringLiteral("the one check passed")
+                                 : QStringLiteral("all %1 checks passed").arg(runner.checks())));
     return Passed;
 }
