@@ -24,6 +24,8 @@ private slots:
     void answer_data();
     void answer();
     void waitingCall();
+    void ringingEnds_data();
+    void ringingEnds();
     void missedCall_data();
     void missedCall();
     void dialingFailures_data();
@@ -154,6 +156,39 @@ void TestCallReactions::waitingCall()
     QVERIFY(GlobalHmi::shown(QStringLiteral("WaitingCall")));
     emit phone()->phoneWaitingCallRemoteRejection();
     TestSupport::processUntilIdle();
+    QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
+}
+
+void TestCallReactions::ringingEnds_data()
+{
+    QTest::addColumn<bool>("duringCall");
+    QTest::addColumn<bool>("connectedFirst");
+
+    QTest::addRow("answered on the handset, connected first") << false << true;
+    QTest::addRow("answered on the handset, ringing ended first") << false << false;
+    QTest::addRow("waiting call ends") << true << false;
+}
+
+// However the ringing ends, and in whichever order the phone reports it, no call popup stays.
+void TestCallReactions::ringingEnds()
+{
+    QFETCH(bool, duringCall);
+    QFETCH(bool, connectedFirst);
+    phone()->setCallConnected(duringCall);
+    QVERIFY(m_hmi->run());
+    phone()->setIncomingCall(true);
+    TestSupport::processUntilIdle();
+    QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
+                                        : QStringLiteral("IncomingCall")));
+
+    for (const bool connectNow : {connectedFirst, !connectedFirst}) {
+        if (connectNow)
+            phone()->setCallConnected(true);
+        else
+            phone()->setIncomingCall(false);
+        TestSupport::processUntilIdle();
+    }
+    QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
     QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
 }
 

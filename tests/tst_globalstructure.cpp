@@ -3,6 +3,7 @@
 // and transitions that share a trigger are offered it in that order.
 
 #include "globalhmi.h"
+#include "hmiphoneglobalstatehandler.h"
 #include "phone_cmp.h"
 
 #include <quorvel/guardedpropertychangetransition.h>
@@ -13,9 +14,10 @@
 
 namespace {
 
-// The global transition list, in registration order. `armed` marks the transitions that the
-// module builds today; the others keep their place for the key, connection and text-message
-// transitions still to come, so that these land at their positions without moving the rest.
+// The global transition list, in registration order, as "source: trigger > target" (a source
+// only for the transitions that keep theirs). `armed` marks the transitions that the module builds
+// today; the others keep their place for the key, connection and text-message transitions still
+// to come, so that these land at their positions without moving the rest.
 struct ListedTransition
 {
     const char *trigger;
@@ -31,7 +33,7 @@ const ListedTransition expectedTransitions[] = {
     {"key 80/1", 3, false},
     {"signal StatusBarController.statusBarVisibleChanged(bool)", 2, false},
     {"event HmiPhone_ShowContactsRequest > PhoneBookCmp", 2, true},
-    {"event HmiPhone_AddPhoneRequest", 3, false},
+    {"PHONE.Root: event HmiPhone_AddPhoneRequest", 3, false},
     {"signal Speech.displayPairingPopup()", 3, false},
     {"event HmiPhone_EndCallRequest", 3, true},
     {"property Phone.incomingCall", 3, true},
@@ -77,14 +79,14 @@ const ListedTransition expectedTransitions[] = {
     {"signal Phone.textMessageDetailsReady()", 3, false},
     {"signal Phone.newTextMessageAlert()", 3, false},
     {"signal Phone.showReplyMessagesRequested() > PhoneSmsReplyListViewState", 3, false},
-    {"event HmiPhoneSms_SendTextMessage", 3, false},
+    {"PhoneSmsReplyListViewState: event HmiPhoneSms_SendTextMessage", 3, false},
     {"signal Phone.replyMessageLineNoChanged(int)", 3, false},
     {"signal Phone.missedCallsPresent()", 3, true},
     {"event HmiPhoneSms_InitiateSendTextMessage", 3, false},
-    {"signal Phone.sendMessageStatusChanged(int)=2", 3, false},
-    {"signal Phone.sendMessageStatusChanged(int)=1", 3, false},
-    {"signal Phone.sendMessageStatusChanged(int)=3", 3, false},
-    {"signal Phone.sendMessageStatusChanged(int)=0", 3, false},
+    {"PHONE.PhoneSmsSendTextMessageProgress: signal Phone.sendMessageStatusChanged(int)=2", 3, false},
+    {"PHONE.PhoneSmsSendTextMessageProgress: signal Phone.sendMessageStatusChanged(int)=1", 3, false},
+    {"PHONE.PhoneSmsSendTextMessageProgress: signal Phone.sendMessageStatusChanged(int)=3", 3, false},
+    {"PHONE.PhoneSmsSendTextMessageProgress: signal Phone.sendMessageStatusChanged(int)=0", 3, false},
     {"event HmiPhoneSms_RetrySendTextMessage", 3, false},
     {"signal Phone.sendMessageRequested()", 3, false},
     {"signal Phone.cancelSendMessageRequested()", 3, false},
@@ -93,11 +95,11 @@ const ListedTransition expectedTransitions[] = {
     {"signal Phone.multipartyActiveCallEnded()", 3, true},
     {"signal Phone.dtmfKeyPressNoResponseErrorReceived()", 3, false},
     {"signal Phone.phoneAudioTransferErrorReceived()", 3, false},
-    {"signal Phone.currentExtendedModeChanged(int)=1", 3, false},
-    {"event HmiPhone_PrivacyRequestOn", 3, false},
-    {"signal Phone.currentExtendedModeChanged(int)=2", 3, false},
-    {"signal Phone.currentExtendedModeChanged(int)=3", 3, false},
-    {"signal Phone.currentExtendedModeChanged(int)=0", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: signal Phone.currentExtendedModeChanged(int)=1", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: event HmiPhone_PrivacyRequestOn", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: signal Phone.currentExtendedModeChanged(int)=2", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: signal Phone.currentExtendedModeChanged(int)=3", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: signal Phone.currentExtendedModeChanged(int)=0", 3, false},
     {"signal Phone.unstableDeviceConnectionWithKovaReceived()", 3, false},
     {"signal Phone.deviceReconnectFailReceived()", 3, false},
     {"signal Phone.phoneWaitingCallRemoteRejection()", 3, true},
@@ -118,7 +120,7 @@ const ListedTransition expectedTransitions[] = {
     {"change Bluetooth.deviceConnected false>true", 3, false},
     {"event HmiPhone_RetryPhnBookDownloadAccessRequest", 3, false},
     {"event HmiPhone_RetryAutomaticContactDownloadRequest", 3, false},
-    {"event HmiPhone_ClearExtendedModeTimer", 3, false},
+    {"PHONE.PhoneCallStandByModePopup: event HmiPhone_ClearExtendedModeTimer", 3, false},
     {"event HmiPhone_ShowSmsRequest", 3, false},
     {"event HmiPhone_ShowSmsRequest", 3, false},
     {"event HmiPhone_ShowSmsStatus > PhoneSmsCmp", 3, false},
@@ -208,6 +210,9 @@ QString describe(QAbstractTransition *transition)
     }
     if (transition->targetState())
         text += QStringLiteral(" > ") + transition->targetState()->objectName();
+    const QAbstractState *source = transition->sourceState();
+    if (source && source->objectName() != QLatin1String("AdoptedTransitions"))
+        text.prepend(source->objectName() + QStringLiteral(": "));
     return text;
 }
 
@@ -223,6 +228,7 @@ private slots:
 
     void popupList();
     void transitionList();
+    void guardsFindTheirTransitions();
 
 private:
     std::unique_ptr<GlobalHmi> m_hmi;
@@ -288,6 +294,44 @@ void TestGlobalStructure::transitionList()
 
     auto *phoneCmp = qobject_cast<HmiPhone::Phone_Cmp *>(m_hmi->host().moduleRoot());
     QCOMPARE(transitions.mid(expected.size()), phoneCmp->rootHierarchyTransitions());
+}
+
+// Every guard asked once after the build: one that reads its transition from a handler field must
+// find it there. The guards of rows still to come are listed; whoever adds such a row removes its
+// guard from the list.
+void TestGlobalStructure::guardsFindTheirTransitions()
+{
+    QList<QByteArray> pending = {
+            // keys
+            "redialKeyTransitionEventTest", "phoneKeyTransitionEventTest",
+            "phoneMultipartySwitchKeyTransitionEventTest", "phoneEndCallKeyTransitionEventTest",
+            // connection and errors
+            "batteryLevelTransitionEventTest", "standbyTransitionEventTest",
+            "showPhoneConnectionLostTest", "showPhoneAttemptingReconnectTest",
+            "showPhoneDoorOpenLinklossTest", "showPhoneDoorNoCallOpenLinklossTest",
+            "dtmfKeyPressNoResponseErrorEventTest", "phoneAudioTransferErrorEventTest",
+            "phoneAudioHandsfreeErrorEventTest", "phoneAudioInternalErrorEventTest",
+            // text messages
+            "newTextMessageTest", "multipleNewTextMessagesTest", "requestedMessageDetailsReadyTest",
+            "smsNewTextHearitEventTest", "smsMessagesInMemoryTest", "smsMessagesNotInMemoryTest",
+            "smsMessageNotificationEnabledTest", "smsMessageNotificationNotEnabledTest"};
+    auto *handler
+            = m_hmi->host().integration()->findChild<HmiPhone::HmiPhoneGlobalStateHandler *>();
+    QVERIFY(handler);
+    TestSupport::processUntilIdle(); // the warning guard takes its place once the run is going
+    QList<QByteArray> missing;
+    const QMetaObject *meta = handler->metaObject();
+    for (int i = meta->methodOffset(); i < meta->methodCount(); ++i) {
+        const QMetaMethod guard = meta->method(i);
+        if (guard.methodType() != QMetaMethod::Slot || !guard.name().endsWith("Test"))
+            continue;
+        QVERIFY(guard.invoke(handler, Qt::DirectConnection, Q_ARG(QEvent *, nullptr)));
+        if (!TestSupport::FrameworkWarningGuard::take().isEmpty())
+            missing.append(guard.name());
+    }
+    std::sort(missing.begin(), missing.end());
+    std::sort(pending.begin(), pending.end());
+    QCOMPARE(missing, pending);
 }
 
 QTEST_GUILESS_MAIN(TestGlobalStructure)

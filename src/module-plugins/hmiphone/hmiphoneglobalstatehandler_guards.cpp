@@ -4,6 +4,7 @@
 #include "hmiphoneglobalstatehandler.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphoneintegration.h"
 
 #include <brisken/viewmanager.h>
 #include <mavrosk/bluetoothsource.h>
@@ -19,11 +20,27 @@ namespace HmiPhone {
 
 namespace {
 
-// A guard whose transition is not built leaves nothing to decide.
+// The transition of a guard that reads it from its handler field. A guard asked while its field is
+// empty belongs to a chart row that does not keep() its transition: that transition would be
+// blocked for good, so it is said loudly.
+template<class Transition> Transition *guarded(Transition *transition)
+{
+    if (!transition)
+        qCWarning(hmiphone()) << "Guard asked without its transition: its chart row keeps none";
+    return transition;
+}
+
 template<class Transition> void allow(Transition *transition, bool allowed)
 {
-    if (transition)
+    if (guarded(transition))
         transition->setAllowTransition(allowed);
+}
+
+// Allows when the condition holds and otherwise leaves the transition blocked, as it starts.
+template<class Transition> void allowOnlyIf(Transition *transition, bool allowed)
+{
+    if (guarded(transition) && allowed)
+        transition->setAllowTransition(true);
 }
 
 } // namespace
@@ -78,7 +95,7 @@ void HmiPhoneGlobalStateHandler::missedCallTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
 {
-    if (!m_callConnectedTransition)
+    if (!guarded(m_callConnectedTransition))
         return;
     // The display context is asked first, and again for the second test; with a route active in
     // context 5 the call screens stay closed whatever the call does.
@@ -96,10 +113,9 @@ void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::redialKeyTransitionEventTest(QEvent *)
 {
-    if (!m_bluetoothSource->deviceConnected())
-        return;
-    allow(m_phoneKeyTransition,
-          m_phoneSource->status() == 0 && m_projectionSource->projectionMode() == 0);
+    if (guarded(m_phoneKeyTransition) && m_bluetoothSource->deviceConnected())
+        allow(m_phoneKeyTransition,
+              m_phoneSource->status() == 0 && m_projectionSource->projectionMode() == 0);
 }
 
 void HmiPhoneGlobalStateHandler::phoneKeyTransitionEventTest(QEvent *)
@@ -135,12 +151,11 @@ void HmiPhoneGlobalStateHandler::isProjectionNotActive()
 
 void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
 {
-    if (!m_bluetoothSource->deviceConnected())
-        return;
-    allow(m_batteryLevelTransition,
-          m_phoneSource->lowBatteryNotification()
-                  && m_controller->shouldBatteryWarningBeShown(
-                          m_phoneSource->deviceBatteryLevel()));
+    if (guarded(m_batteryLevelTransition) && m_bluetoothSource->deviceConnected())
+        allow(m_batteryLevelTransition,
+              m_phoneSource->lowBatteryNotification()
+                      && m_controller->shouldBatteryWarningBeShown(
+                              m_phoneSource->deviceBatteryLevel()));
 }
 
 void HmiPhoneGlobalStateHandler::standbyTransitionEventTest(QEvent *)
@@ -172,14 +187,12 @@ void HmiPhoneGlobalStateHandler::showPhoneDoorNoCallOpenLinklossTest(QEvent *)
 // exactly one of them, and the other is left at its default (blocked).
 void HmiPhoneGlobalStateHandler::newTextMessageTest(QEvent *)
 {
-    if (m_textMessageAlertState == 0)
-        allow(m_newTextMessageTransition, true);
+    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == 0);
 }
 
 void HmiPhoneGlobalStateHandler::multipleNewTextMessagesTest(QEvent *)
 {
-    if (m_textMessageAlertState != 0)
-        allow(m_multipleNewTextMessagesTransition, true);
+    allowOnlyIf(m_multipleNewTextMessagesTransition, m_textMessageAlertState != 0);
 }
 
 void HmiPhoneGlobalStateHandler::requestedMessageDetailsReadyTest(QEvent *)
