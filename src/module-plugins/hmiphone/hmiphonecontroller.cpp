@@ -2,6 +2,7 @@
 
 #include "hmiphoneevents.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneproductconfig.h"
 
 #include <brisken/viewcontroller.h>
@@ -15,13 +16,6 @@
 namespace HmiPhone {
 
 namespace {
-
-// Intent actions the controller asks for (the platform's numbering).
-constexpr int PhoneSettingsAction = 7;
-constexpr int BluetoothDevicesAction = 15;
-constexpr int NavigationPoiByAddressAction = 20;
-constexpr int AddPhoneAction = 28;
-constexpr int ConnectedDeviceSettingsAction = 51;
 
 // Five pages of contacts at most in the driver-restricted window; one letter at most 20 rows.
 constexpr int DriverRestrictedPages = 5;
@@ -497,29 +491,29 @@ void HmiPhoneController::requestPhoneDeleteAllContactsPopup()
 
 void HmiPhoneController::addPhonePressed()
 {
-    requestIntent(AddPhoneAction);
+    requestIntent(IntentAction::AddPhone);
 }
 
 void HmiPhoneController::gotoPhoneSettings()
 {
-    requestIntent(PhoneSettingsAction);
+    requestIntent(IntentAction::PhoneSettings);
 }
 
 void HmiPhoneController::viewBluetoothDevices()
 {
-    requestIntent(BluetoothDevicesAction);
+    requestIntent(IntentAction::BluetoothDevices);
 }
 
 void HmiPhoneController::showConnectedDeviceSettings()
 {
-    requestIntent(ConnectedDeviceSettingsAction);
+    requestIntent(IntentAction::ConnectedDeviceSettings);
 }
 
 void HmiPhoneController::showNavPOIByAddress(const QString &name, const QString &street,
                                              const QString &city, const QString &state,
                                              const QString &country, const QString &zip)
 {
-    requestIntent(NavigationPoiByAddressAction,
+    requestIntent(IntentAction::NavigationPoiByAddress,
                   QVariantList{name, street, city, state, country, zip});
 }
 

@@ -4,6 +4,7 @@
 #include "hmiphoneevents.h"
 #include "hmiphoneglobalchart.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 #include "phone_cmp.h"
@@ -252,6 +253,7 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     using H = HmiPhoneGlobalStateHandler;
     using PM = HmiPhonePopupManager;
     using Mavrosk::PhoneSource;
+    namespace Status = CallStatus;
     const auto L2 = Quorvel::StateLevel2;
     PhoneSource *phone = m_phoneSource;
     PM *pm = m_popupManager;
@@ -324,9 +326,9 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
 
     // The call status: dialling, entering the call screens, connected outgoing calls; only a
     // single call getting through clears a dialling failure still on screen.
-    chart.change(phone, "status", {}, 3).parallelExclusive(0)
+    chart.change(phone, "status", {}, Status::OutgoingSetUp).parallelExclusive(0)
             .run(&H::showPhoneDialingTransientMessage).list(64);
-    chart.change(phone, "status", {}, 4).parallelExclusive(0)
+    chart.change(phone, "status", {}, Status::OutgoingSetUpBesideCall).parallelExclusive(0)
             .run(&H::showPhoneDialingTransientMessage).list(65);
     chart.property(phone, "status").parallelExclusive(1).keep(m_callConnectedTransition)
             .to(phoneCmp->phoneCallCompositeState())
@@ -334,14 +336,15 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.change(phone, "callConnected", {false}, true)
             .run(Brisken::DismissPopup(Views::PhoneSmsDownloading))
             .run(Brisken::DismissPopup(Views::PhoneBookDownloading)).list(18);
-    chart.change(phone, "status", {3}, 7).parallelExclusive(0)
+    chart.change(phone, "status", {Status::OutgoingSetUp}, Status::OneCallConnected)
+            .parallelExclusive(0)
             .run(&H::showPhoneConnectedOutgoingCallTransientMessage).run(&H::hideDialingFailed).list(12);
-    chart.change(phone, "status", {4}, 9).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(13);
-    chart.change(phone, "status", {5}, 10).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(14);
-    chart.change(phone, "status", {6}, 11).parallelExclusive(0)
-            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideCall}, Status::SwappableCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(13);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideTwoCalls}, Status::TwoCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(14);
+    chart.change(phone, "status", {Status::OutgoingSetUpRefusing}, Status::FurtherCallRefused)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
     chart.change(phone, "privateMode", {}, 1).run(&H::hideCallKeyPad).list(16);
 
     // ["phoneBookStatus": becomes 2, leaves 2, 2 to 1]
@@ -449,7 +452,7 @@ void HmiPhoneGlobalStateHandler::incomingCall()
 {
     // A call the driver cannot take now is refused at once, without a popup or a transient.
     if (m_phoneSource->doNotDisturb() || m_phoneSource->multipleCallsConnected()
-        || m_phoneSource->status() == 11) {
+        || m_phoneSource->status() == CallStatus::FurtherCallRefused) {
         m_phoneSource->rejectIncomingCall();
         return;
     }
@@ -547,12 +550,12 @@ void HmiPhoneGlobalStateHandler::roamingCallCancelled()
 void HmiPhoneGlobalStateHandler::handleDialingFailure()
 {
     switch (m_phoneSource->status()) {
-    case 3:
-    case 4:
-    case 5:
-    case 6:
-    case 0:
-    case 1:
+    case CallStatus::OutgoingSetUp:
+    case CallStatus::OutgoingSetUpBesideCall:
+    case CallStatus::OutgoingSetUpBesideTwoCalls:
+    case CallStatus::OutgoingSetUpRefusing:
+    case CallStatus::NoCall:
+    case CallStatus::SetUpOrFailure:
         // Two failures in a row show the ordinary popup, the third the one with more help.
         if (m_dialingFailureCount > 1) {
             m_dialingFailureCount = 0;
@@ -588,8 +591,8 @@ void HmiPhoneGlobalStateHandler::onMissedCallPopupExited()
 
 void HmiPhoneGlobalStateHandler::addPhoneRequested()
 {
-    Taldris::HmiIntentManager::instance()->requestAction(14, {QVariant(ModuleName)}, false, false,
-                                                         QVariant());
+    Taldris::HmiIntentManager::instance()->requestAction(
+            IntentAction::PairPhone, {QVariant(ModuleName)}, false, false, QVariant());
 }
 
 // Posted through the controller, at normal priority, to the HMI's one machine, like every other

@@ -5,6 +5,7 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 
 #include <brisken/viewmanager.h>
 #include <mavrosk/bluetoothsource.h>
@@ -51,7 +52,8 @@ void HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest(QEvent *)
     if (!transition)
         return;
     // A projection that owns the call but does not render it shows its own call screen.
-    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+    if (!m_projectionSource->isRendering()
+        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
         transition->setAllowTransition(false);
         return;
     }
@@ -63,7 +65,8 @@ void HmiPhoneGlobalStateHandler::incomingCallKeySignalTransitionEventTest(QEvent
     auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
     if (!transition)
         return;
-    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+    if (!m_projectionSource->isRendering()
+        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
         transition->setAllowTransition(false);
         return;
     }
@@ -78,14 +81,16 @@ void HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest(QEvent *)
         return;
     // A rendering projection tells the driver about missed calls itself.
     transition->setAllowTransition(
-            !(m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1));
+            !(m_projectionSource->isRendering()
+              && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection));
 }
 
 void HmiPhoneGlobalStateHandler::incomingCallonPrjDisconnectTransitionEventTest(QEvent *)
 {
     allow(m_incomingCallOnProjectionDisconnectTransition,
           !m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
-                  && Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+                  && Mavrosk::ProjectionSource::instance()->projectionMode()
+                          == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::missedCallTransitionEventTest(QEvent *)
@@ -98,14 +103,16 @@ void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
     if (!guarded(m_callConnectedTransition))
         return;
     // The display context is asked first, and again for the second test; with a route active in
-    // context 5 the call screens stay closed whatever the call does.
-    const auto context = [this] { return m_viewManager ? m_viewManager->displayContext() : 0; };
+    // CallScreensWithoutRoute the call screens stay closed whatever the call does.
+    const auto context = [this] {
+        return m_viewManager ? m_viewManager->displayContext() : DisplayContext::Default;
+    };
     const auto callOngoing = [this] {
         return m_phoneSource->callConnected() || m_phoneSource->dialingInProgress();
     };
-    if (context() == 5)
+    if (context() == DisplayContext::CallScreensWithoutRoute)
         m_callConnectedTransition->setAllowTransition(!m_navSource->routeActive() && callOngoing());
-    else if (context() == 1)
+    else if (context() == DisplayContext::WithoutCallScreens)
         m_callConnectedTransition->setAllowTransition(false);
     else
         m_callConnectedTransition->setAllowTransition(callOngoing());
@@ -115,21 +122,23 @@ void HmiPhoneGlobalStateHandler::redialKeyTransitionEventTest(QEvent *)
 {
     if (guarded(m_phoneKeyTransition) && m_bluetoothSource->deviceConnected())
         allow(m_phoneKeyTransition,
-              m_phoneSource->status() == 0 && m_projectionSource->projectionMode() == 0);
+              m_phoneSource->status() == CallStatus::NoCall
+                      && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneKeyTransitionEventTest(QEvent *)
 {
     allow(m_phoneKeyTransition,
-          !m_phoneSource->incomingCall() && m_phoneSource->status() == 0
-                  && m_projectionSource->projectionMode() == 0);
+          !m_phoneSource->incomingCall() && m_phoneSource->status() == CallStatus::NoCall
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneMultipartySwitchKeyTransitionEventTest(QEvent *)
 {
     allow(m_multipartySwitchKeyTransition,
-          !m_phoneSource->privateMode() && m_phoneSource->status() == 9
-                  && m_projectionSource->projectionMode() == 0);
+          !m_phoneSource->privateMode()
+                  && m_phoneSource->status() == CallStatus::SwappableCallsConnected
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
@@ -138,7 +147,7 @@ void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
             || m_phoneSource->multipleCallsConnected();
     allow(m_phoneEndCallKeyTransition,
           !m_phoneSource->privateMode() && callInProgress && !m_phoneSource->incomingCall()
-                  && m_projectionSource->projectionMode() == 0);
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::isProjectionNotActive()
@@ -146,7 +155,8 @@ void HmiPhoneGlobalStateHandler::isProjectionNotActive()
     auto *transition = qobject_cast<Quorvel::KeySignalTransition *>(sender());
     if (!transition)
         return;
-    transition->setAllowTransition(Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+    transition->setAllowTransition(Mavrosk::ProjectionSource::instance()->projectionMode()
+                                   == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
@@ -160,7 +170,7 @@ void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::standbyTransitionEventTest(QEvent *)
 {
-    allow(m_standbyTransition, m_phoneSource->status() == 12);
+    allow(m_standbyTransition, m_phoneSource->status() == CallStatus::Standby);
 }
 
 void HmiPhoneGlobalStateHandler::showPhoneConnectionLostTest(QEvent *)

@@ -2,6 +2,7 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
 #include <brisken/requestview.h>
@@ -14,16 +15,7 @@ namespace HmiPhone {
 
 namespace {
 
-enum Action {
-    CallNumber = 1,
-    PhoneSettings = 7,
-    AddPhone = 28,
-    StatusBarAlerts = 32,
-    SiriNotEnabled = 47,
-    PhoneRoot = 56,
-    PhoneBookStatusCheck = 67,
-    ManageContactsSettings = 68,
-};
+using namespace IntentAction;
 
 // The actions that only post an event to the HMI state machine.
 QString eventForAction(int action)
