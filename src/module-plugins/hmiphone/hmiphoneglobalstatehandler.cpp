@@ -413,13 +413,13 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.signal(phone, &PhoneSource::cancelSendMessageRequested).run(pm, &PM::hideSendTextMessage).list(63);
     chart.event(Events::HmiPhoneSms_RetrySendTextMessage).run(&H::handleRetrySendTextMessage).list(61);
     PopupState *sendProgress = popup(Views::PhoneSmsSendTextMessageProgress);
-    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, 2, sendProgress)
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Sent, sendProgress)
             .run(&H::handleSendTextMessageSuccess).list(57);
-    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, 1, sendProgress)
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Failed, sendProgress)
             .run(&H::handleSendTextMessageFailure).list(58);
-    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, 3, sendProgress)
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NetworkFailure, sendProgress)
             .run(&H::handleSendTextMessageNetworkFailure).list(59);
-    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, 0, sendProgress)
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NotSent, sendProgress)
             .run(&H::handleSendTextMessageFailure).list(60);
     chart.signal(phone, &PhoneSource::sendMessageNoResponseFromPhoneAlert)
             .run(&H::handleSendMessageNoResponseFromPhone).list(113);

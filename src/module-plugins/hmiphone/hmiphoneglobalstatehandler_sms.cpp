@@ -7,6 +7,7 @@
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 
 #include <mavrosk/bluetoothsource.h>
@@ -16,6 +17,11 @@
 namespace HmiPhone {
 
 namespace {
+
+// Retries of a failed send before the final failure popup.
+constexpr int SendRetries = 2;
+// Download attempts after which a failed text-message download offers no retry.
+constexpr int SmsDownloadAttempts = 3;
 
 // Once the phone was reported as not answering, a late outcome of that send is not shown.
 bool closeSendProgress(Mavrosk::PhoneSource *phone, HmiPhonePopupManager *popupManager)
@@ -47,15 +53,15 @@ void HmiPhoneGlobalStateHandler::handleNewTextMessagesReceived()
 {
     m_controller->incrementRecievedTextMessageCount();
     switch (m_textMessageAlertState) {
-    case 0:
+    case TextMessageAlert::None:
         m_popupManager->newTextMessageAlert2Show();
         break;
-    case 1:
+    case TextMessageAlert::Single:
         // A second message while the single alert is up: the multiple-messages alert replaces it.
         m_popupManager->showMultipleTextMessagePopup();
         m_multipleTextMessagesPopup->restartAutoDismissTimer();
         break;
-    case 2:
+    case TextMessageAlert::Multiple:
         // Each further message keeps the multiple-messages alert up for its full time again.
         m_multipleTextMessagesPopup->restartAutoDismissTimer();
         break;
@@ -66,14 +72,14 @@ void HmiPhoneGlobalStateHandler::handleNewTextMessagesReceived()
 
 void HmiPhoneGlobalStateHandler::enableSingleMessageState()
 {
-    m_textMessageAlertState = 1;
+    m_textMessageAlertState = TextMessageAlert::Single;
 }
 
 void HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout()
 {
     // A state of 2 was set by the multiple-messages alert replacing this one: it stays.
-    if (m_textMessageAlertState == 1)
-        m_textMessageAlertState = 0;
+    if (m_textMessageAlertState == TextMessageAlert::Single)
+        m_textMessageAlertState = TextMessageAlert::None;
     if (m_phoneSource->hearItPressed()) {
         m_phoneSource->requestTextMessagesInbox();
         m_phoneSource->setHearItPressed(false);
@@ -82,12 +88,12 @@ void HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout()
 
 void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
 {
-    m_textMessageAlertState = 2;
+    m_textMessageAlertState = TextMessageAlert::Multiple;
 }
 
 void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
 {
-    m_textMessageAlertState = 0;
+    m_textMessageAlertState = TextMessageAlert::None;
     m_controller->resetRecievedTextMessageCount();
 }
 
@@ -171,7 +177,7 @@ void HmiPhoneGlobalStateHandler::handleSendTextMessageRequest()
 void HmiPhoneGlobalStateHandler::handleRetrySendTextMessage()
 {
     m_popupManager->hideSendTextMessageFailure();
-    if (m_sendMessageRetryCount > 1) {
+    if (m_sendMessageRetryCount >= SendRetries) {
         m_popupManager->showRetrySendMessageFailure();
         m_sendMessageRetryCount = 0;
         return;
@@ -236,22 +242,22 @@ void HmiPhoneGlobalStateHandler::smsCheckStatus()
         return;
     }
     const int status = m_phoneSource->messagesDownloadingStatus();
-    if (status >= 0 && status <= 3) {
+    if (status >= MessagesDownload::NotStarted && status <= MessagesDownload::Finished) {
         // A finished download of an empty inbox has nothing to wait for: open the screens.
-        if (status == 3 && m_phoneSource->messagesInboxEmptyStatus())
+        if (status == MessagesDownload::Finished && m_phoneSource->messagesInboxEmptyStatus())
             postEvent(Events::HmiPhone_ShowSmsIphoneRequest);
         else
             m_popupManager->showMessagesDownloading();
-    } else if (status == 4) {
+    } else if (status == MessagesDownload::Failed) {
         m_popupManager->showMessagesDownloadFailed();
     }
 }
 
 void HmiPhoneGlobalStateHandler::checkSmsStatus()
 {
-    if (m_phoneSource->messagesDownloadingStatus() != 4)
+    if (m_phoneSource->messagesDownloadingStatus() != MessagesDownload::Failed)
         return;
-    if (m_phoneSource->numOfSmsDownloadAttempts() < 3)
+    if (m_phoneSource->numOfSmsDownloadAttempts() < SmsDownloadAttempts)
         m_popupManager->showSmsDownloadFailedRetryAvailable();
     else
         m_popupManager->showSmsDownloadFailed();
