@@ -359,7 +359,56 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
 
     // --- Keys --------------------------------------------------------------------------------
 
-    // [the 26 key rows, in the creation order of the key table]
+    // One key event may satisfy several rows; the guards keep the always-armed ones apart. The
+    // "WaitingCall" rows listen only while that popup is open, unguarded, and add its dismissal
+    // to what the always-armed row of the same key does.
+    PM *keyPopups = HmiPhonePopupManager::instance();
+    const int Press = KeyPress::Press, Short = KeyPress::ShortPress, Long = KeyPress::LongPress,
+              Release = KeyPress::LongPressRelease;
+    const auto notProjected = &H::isProjectionNotActive;
+    PopupState *waiting = m_waitingCallPopup;
+    chart.key(Key::Phone, Short).keep(m_phoneKeyTransition)
+            .guard(&H::phoneKeyTransitionEventTest).to(phoneCmp).list(1);
+    chart.key(Key::Phone, Short).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(2);
+    chart.key(Key::Phone, Long).keep(m_phoneEndCallKeyTransition)
+            .guard(&H::phoneEndCallKeyTransitionEventTest).run(&H::processRejectKeyPhone).list(20);
+    chart.key(Key::Phone, Long).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(21);
+    chart.key(Key::Phone, Short).keep(m_multipartySwitchKeyTransition)
+            .guard(&H::phoneMultipartySwitchKeyTransitionEventTest)
+            .run(&H::processMultipartySinglePressPhone).list(31);
+    chart.key(Key::Phone, Short, waiting)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::Phone, Long, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::AcceptOrSeekLeft, Press).guard(notProjected).run(&H::processAcceptOrSeek).list(19);
+    chart.key(Key::AcceptOrSeekLeft, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::RejectOrSeekRight, Press).guard(notProjected).run(&H::processRejectOrSeek).list(22);
+    // The same press as the row above, which posts the rejection to this very popup.
+    chart.key(Key::RejectOrSeekRight, Press, waiting).runLater(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(23);
+    chart.key(Key::SendAccept, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(24);
+    chart.key(Key::EndReject, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept2, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(3);
+    chart.key(Key::SendAccept2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject2, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(4);
+    chart.key(Key::EndReject2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekDown, Short).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeek).list(25);
+    chart.key(Key::SteeringWheelSeekUp, Short, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekUp, Short).guard(notProjected)
+            .run(&H::processSWCRejectOrSeek).list(26);
+    chart.key(Key::SteeringWheelSeekDown, Long).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongPress).list(27);
+    chart.key(Key::SteeringWheelSeekDown, Release).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongRelease).list(28);
+    chart.key(Key::SteeringWheelSeekUp, Long).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongPress).list(29);
+    chart.key(Key::SteeringWheelSeekUp, Release).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongRelease).list(30);
 
     // --- Requests, messages and connection ---------------------------------------------------
 

@@ -123,6 +123,20 @@ private slots:
     void smsCheckStatus();
     void checkSmsStatus();
 
+    // Phone keys: what each key does in the current call situation
+    void processAcceptOrSeek();
+    void processRejectOrSeek();
+    void processPhoneSendAcceptKey();
+    void processPhoneEndRejectKey();
+    void processRejectKeyPhone();
+    void processMultipartySinglePressPhone();
+    void processSWCAcceptOrSeek();
+    void processSWCRejectOrSeek();
+    void processSWCAcceptOrSeekLongPress();
+    void processSWCAcceptOrSeekLongRelease();
+    void processSWCRejectOrSeekLongPress();
+    void processSWCRejectOrSeekLongRelease();
+
     // Guard tests: each allows or blocks the transition that asks
     void incomingCallTransitionEventTest(QEvent *event);
     void incomingCallKeySignalTransitionEventTest(QEvent *event);
