@@ -8,6 +8,7 @@
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#include "window/headunitwindow.h"
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -20,8 +21,11 @@
 #include <QQmlEngine>
 #include <QTextStream>
 
+#include <algorithm>
 #include <cstdio>
+#include <cstring>
 #include <iostream>
+#include <memory>
 #include <string>
 
 #ifndef HMIPHONE_PLUGIN_FILE
@@ -69,6 +73,22 @@ void createBridge()
     Mavrosk::ArdelSource::instance();
 }
 
+enum class Display { None, Window, Screenshots };
+
+// Read before the application exists: a window needs a GUI application, and on screen the
+// platform's own event loop.
+Display displayOf(int argc, char *argv[])
+{
+    Display display = Display::None;
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--window") == 0)
+            display = Display::Window;
+        else if (std::strncmp(argv[i], "--screenshots", 13) == 0)
+            display = Display::Screenshots;
+    }
+    return display;
+}
+
 void printError(const QString &message)
 {
     std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
@@ -78,9 +98,25 @@ void printError(const QString &message)
 
 int main(int argc, char *argv[])
 {
+    const Display display = displayOf(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
-    QCoreApplication::setEventDispatcher(clock);
-    QCoreApplication app(argc, argv);
+    std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
+    if (display == Display::Window) {
+        // A window on screen runs the platform's event loop: the module's timers run in real
+        // time and the clock follows it.
+        realTimeClock.reset(clock);
+        clock->followRealTime();
+    } else {
+        QCoreApplication::setEventDispatcher(clock);
+    }
+    std::unique_ptr<QCoreApplication> application(
+            display == Display::None
+                    ? new QCoreApplication(argc, argv)
+                    : Simulator::HeadUnitWindow::createApplication(
+                            argc, argv,
+                            display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
+                                                       : Simulator::HeadUnitWindow::OffScreen));
+    QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
 
     QCommandLineParser parser;
@@ -112,13 +148,30 @@ int main(int argc, char *argv[])
             QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
                            "critical or none (default: debug)."),
             QStringLiteral("level"), QStringLiteral("debug"));
-    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption});
+    const QCommandLineOption windowOption(
+            QStringLiteral("window"),
+            QStringLiteral("Show the head unit in a window: its display, the car's keys and the "
+                           "phone's side to press, the trace; play, pause and step through the "
+                           "scenario, if one is given. Time runs in real time."));
+    const QCommandLineOption screenshotsOption(
+            QStringLiteral("screenshots"),
+            QStringLiteral("Play the scenario off screen (no display needed) and write a picture "
+                           "of the display to the directory after each step that changes it, "
+                           "named by the step's line."),
+            QStringLiteral("directory"));
+    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
+                       windowOption, screenshotsOption});
     parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
     const QStringList positional = parser.positionalArguments();
-    if (positional.size() > 1 || (positional.isEmpty() && !interactive)) {
+    if (positional.size() > 1
+        || (positional.isEmpty() && !interactive && display != Display::Window)) {
         printError(QStringLiteral("give one scenario file, or --interactive"));
+        return CannotRun;
+    }
+    if (display != Display::None && (interactive || positional.value(0) == QLatin1String("-"))) {
+        printError(QStringLiteral("--window and --screenshots read no steps from stdin"));
         return CannotRun;
     }
     const QString phoneMode = parser.value(phoneOption);
@@ -142,7 +195,7 @@ int main(int argc, char *argv[])
             return CannotRun;
         }
         text = file.readAll();
-    } else if (!interactive) {
+    } else if (!interactive && display == Display::None) {
         QFile input;
         if (!input.open(stdin, QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read stdin"));
@@ -192,8 +245,43 @@ int main(int argc, char *argv[])
         return CannotRun;
     }
 
-    for (const Simulator::ScenarioStep &step : steps)
-        runner.play(step);
+    if (display != Display::None) {
+        // Steps of the window's panels are checked as they come, like typed ones.
+        auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (error.isEmpty())
+                runner.play(step);
+            else
+                output.note(QStringLiteral("# %1 cannot run: %2").arg(step.text, error));
+        };
+        // The window draws the module's screens from the start, unless the scenario starts it.
+        if (std::none_of(steps.begin(), steps.end(), [](const Simulator::ScenarioStep &step) {
+                return step.kind == Simulator::ScenarioStep::Start;
+            }))
+            runner.finish();
+        Simulator::HeadUnitWindow window(&engine, &output, clock, play,
+                                         display == Display::Window
+                                                 ? Simulator::HeadUnitWindow::OnScreen
+                                                 : Simulator::HeadUnitWindow::OffScreen);
+        window.setScenario(steps);
+        if (display == Display::Window) {
+            window.show();
+            app.exec();
+        } else {
+            QString error;
+            const int pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
+            if (pictures < 0) {
+                printError(error);
+                return CannotRun;
+            }
+            output.note(QStringLiteral("# %1 pictures in %2")
+                                .arg(pictures)
+                                .arg(parser.value(screenshotsOption)));
+        }
+    } else {
+        for (const Simulator::ScenarioStep &step : steps)
+            runner.play(step);
+    }
     int refused = 0;
     if (interactive) {
         // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot

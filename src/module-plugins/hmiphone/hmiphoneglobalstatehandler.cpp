@@ -648,6 +648,11 @@ void HmiPhoneGlobalStateHandler::addPhoneRequested()
 // event of the module.
 void HmiPhoneGlobalStateHandler::postEvent(const QString &name)
 {
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneGlobalStateHandler: the controller is gone," << name
+                            << "not posted";
+        return;
+    }
     m_controller->postEvent(new Quorvel::HmiEvent(name, QVariant()));
 }
 

@@ -6,6 +6,7 @@
 #include <QList>
 #include <QObject>
 #include <QPair>
+#include <QPointer>
 
 class QAbstractTransition;
 class QEvent;
@@ -179,7 +180,7 @@ private:
     void hideTransient(const QString &name);
     void postEvent(const QString &name);
 
-    HmiPhoneController *m_controller;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
     HmiPhonePopupManager *m_popupManager;
     Brisken::ViewController *m_viewController;
     Brisken::ViewManager *m_viewManager;

@@ -163,7 +163,7 @@ void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
 {
     if (guarded(m_batteryLevelTransition) && m_bluetoothSource->deviceConnected())
         allow(m_batteryLevelTransition,
-              m_phoneSource->lowBatteryNotification()
+              m_phoneSource->lowBatteryNotification() && m_controller
                       && m_controller->shouldBatteryWarningBeShown(
                               m_phoneSource->deviceBatteryLevel()));
 }

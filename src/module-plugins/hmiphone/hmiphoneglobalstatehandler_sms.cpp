@@ -51,7 +51,8 @@ void HmiPhoneGlobalStateHandler::processNewTextMessageAlert()
 
 void HmiPhoneGlobalStateHandler::handleNewTextMessagesReceived()
 {
-    m_controller->incrementRecievedTextMessageCount();
+    if (m_controller) // QML may have deleted it
+        m_controller->incrementRecievedTextMessageCount();
     switch (m_textMessageAlertState) {
     case TextMessageAlert::None:
         m_popupManager->newTextMessageAlert2Show();
@@ -94,7 +95,8 @@ void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
 void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
 {
     m_textMessageAlertState = TextMessageAlert::None;
-    m_controller->resetRecievedTextMessageCount();
+    if (m_controller) // QML may have deleted it
+        m_controller->resetRecievedTextMessageCount();
 }
 
 // --- What the driver does with an alert
@@ -231,10 +233,10 @@ void HmiPhoneGlobalStateHandler::smsCheckStatus()
 {
     // An Apple phone keeps its messages itself: access alone decides.
     if (m_bluetoothSource->iOSAppleDeviceConnected()) {
-        if (m_phoneSource->messageAccessProfileStatus())
-            m_controller->viewIphoneTextMessages();
-        else
+        if (!m_phoneSource->messageAccessProfileStatus())
             m_popupManager->showMessageAccessNotGranted();
+        else if (m_controller)
+            m_controller->viewIphoneTextMessages();
         return;
     }
     if (!m_phoneSource->messageAccessProfileStatus()) {
