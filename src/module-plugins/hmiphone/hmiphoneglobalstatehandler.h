@@ -124,6 +124,26 @@ private slots:
     void smsCheckStatus();
     void checkSmsStatus();
 
+    // Link loss and reconnection
+    void handleLinklossReconnectSuccessTransition();
+    void showPhoneAttemptingReconnectTransient();
+    void showPhoneConnectSuccessTransient();
+
+    // Extended mode: the minute countdown while "PhoneCallStandByModePopup" is concerned
+    void handleExtendedModeChangeRequest();
+    void clearExtendedModeTimer();
+    void extendedModeTimerMinuteElapsed();
+
+    // Contacts download and its retries
+    void handlePhonebookDownloadCompleteDisplay();
+    void handleRetryPhnBookDownloadContactAccess();
+    void handleRetryPhnBookAutomaticContactDownload();
+
+    // Not connected by the module; reachable through the meta-object
+    void retryPhoneBookDownload();
+    void retrySmsDownload();
+    void phoneFixHintTimeout();
+
     // Phone keys: what each key does in the current call situation
     void processAcceptOrSeek();
     void processRejectOrSeek();
