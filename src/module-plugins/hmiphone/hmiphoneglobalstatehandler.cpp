@@ -311,6 +311,7 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.event(Events::HmiPhone_AddPhoneRequest, phoneCmp).run(&H::addPhoneRequested).list(7);
     chart.signal(m_speechSource, &Mavrosk::SpeechSource::displayPairingPopup).voiceEvent()
             .run(Taldris::HmiIntentRequest(14, {ModuleName}, false, true, QVariant())).list(8);
+
     chart.event(Events::HmiPhone_EndCallRequest).run(&H::endCall).list(9);
 
     // The phone rings: two guarded transitions on the same change of "incomingCall" split the
