@@ -50,7 +50,7 @@ void SimulatorTest::scenarioFile_data()
             {"advance of 1e300", "{\"advance\": 1e300}", ":2: \"advance\" must be from 0"},
             {"advance negative", "{\"advance\": -1}", ":2: \"advance\" must be from 0"},
             {"open elsewhere", "{\"open\": \"radio\"}",
-             ":2: the menu bar opens phone, home or settings"},
+             ":2: the menu bar opens phone, home, settings or settings/<entry>"},
             {"NUL byte", QByteArray("{\"back\": 1}\0 {\"back\": 1}", 25),
              ":2: a NUL byte at column 12"},
             {"invalid UTF-8", "{\"post\": \"\xff\xfe\"}", ":2: not UTF-8 text"},
@@ -104,9 +104,10 @@ void SimulatorTest::scenarioFile_data()
             << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
             << 1 << QStringLiteral(": 1 of 3 checks failed (line 2)");
-    QTest::newRow("a slot argument Qt cannot convert")
-            << QByteArray("{\"call\": \"fixStatusAlert\", \"args\": [[1]]}\n") << 1
-            << QStringLiteral(": 1 step could not be applied (line 1)");
+    QTest::newRow("a call after QML deleted the controller")
+            << QByteArray("{\"call\": \"deleteLater\"}\n{\"intent\": 1, \"args\": [\"0123\"]}\n"
+                          "{\"call\": \"endCall\"}\n")
+            << 1 << QStringLiteral(": 1 step could not be applied (line 3)");
     QTest::newRow("a year at a time, twice")
             << QByteArray("{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")

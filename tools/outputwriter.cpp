@@ -111,20 +111,23 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 {
     Output output{m_clock ? m_clock->now() : 0, kind, fields};
     m_outputs.append(output);
-    QString line;
-    if (m_format == Json) {
-        line = toJsonLine(output);
-    } else {
-        const QString seconds = QString::number(double(output.time) / 1000.0, 'f', 3);
-        line = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
-    }
+    if (m_silent)
+        return;
+    const QString seconds = QString::number(double(output.time) / 1000.0, 'f', 3);
+    const QString human
+            = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
+    const QString line = m_format == Json ? toJsonLine(output) : human;
     std::fputs(line.toUtf8().constData(), m_stream);
     std::fputc('\n', m_stream);
     std::fflush(m_stream);
+    emit written(human);
 }
 
 void OutputWriter::note(const QString &text)
 {
+    if (m_silent)
+        return;
+    emit written(text);
     if (m_format != Human)
         return;
     std::fputs(text.toUtf8().constData(), m_stream);
@@ -134,7 +137,8 @@ void OutputWriter::note(const QString &text)
 
 void OutputWriter::beginInput()
 {
-    m_inputStart = m_outputs.size();
+    m_outputs.clear();
+    m_inputStart = 0;
 }
 
 QString OutputWriter::details(const Output &output)
@@ -174,6 +178,11 @@ QString OutputWriter::details(const Output &output)
         return value.isValid() ? QStringLiteral("%1 %2").arg(field("name"), compactJson(value))
                                : field("name");
     }
+    if (kind == QLatin1String("menu-entry"))
+        return QStringLiteral("%1: %2 %3")
+                .arg(field("menu"), field("name"),
+                     f.value(QStringLiteral("enabled")).toBool() ? QStringLiteral("enabled")
+                                                                 : QStringLiteral("disabled"));
     if (kind == QLatin1String("log"))
         return QStringLiteral("[%1] %2").arg(field("level"), field("msg"));
     if (kind == QLatin1String("check"))
@@ -196,7 +205,8 @@ void OutputWriter::captureLog(const QString &category, int minimumLevel)
     m_logCategory = category;
     m_logLevel = minimumLevel;
     // The module's category writes only warnings by default; the simulator shows what was asked.
-    QString rules;
+    // Silent, the platform's own chatter goes too; its warnings still reach stderr.
+    QString rules = m_silent ? QStringLiteral("*.debug=false\n*.info=false\n") : QString();
     const char *levels[] = {"debug", "info", "warning", "critical"};
     for (int level = 0; level < 4; ++level)
         rules += QStringLiteral("%1.%2=%3\n")

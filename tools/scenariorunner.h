@@ -5,6 +5,7 @@
 
 #include <QList>
 #include <QObject>
+#include <QPointer>
 #include <QString>
 
 class QQmlEngine;
@@ -70,6 +71,9 @@ private:
     QString apply(const ScenarioStep &step);
     QString writeValue(const QString &name, const QJsonValue &value);
     void report(int line, const QString &message);
+    // {"open": "settings/<entry>"}: the settings menu's entry, chosen as the driver would; empty
+    // or why it could not be.
+    QString chooseSettingsEntry(const QString &entry);
 
     Host::ModuleHost *m_host;
     QQmlEngine *m_engine;
@@ -85,6 +89,7 @@ private:
     int m_stepErrors = 0;
     QList<int> m_failedLines;
     QString m_setUpError;
+    QPointer<QObject> m_controller;
 };
 
 } // namespace Simulator

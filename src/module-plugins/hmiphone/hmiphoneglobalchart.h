@@ -72,6 +72,15 @@ public:
             QObject::connect(m_transition, &QAbstractTransition::triggered, receiver, slot);
             return *this;
         }
+        // The slot runs after the machine has handled the events posted while this transition and
+        // those fired with it ran (a queued connection): a popup closed this way still takes the
+        // answer another key row posted to it.
+        template<class Receiver, class Slot> Row runLater(Receiver *receiver, Slot slot) const
+        {
+            QObject::connect(m_transition, &QAbstractTransition::triggered, receiver, slot,
+                             Qt::QueuedConnection);
+            return *this;
+        }
         Row parallelExclusive(int group) const
         {
             m_transition->makeParallelExclusive(group);

@@ -163,7 +163,7 @@ void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
 {
     if (guarded(m_batteryLevelTransition) && m_bluetoothSource->deviceConnected())
         allow(m_batteryLevelTransition,
-              m_phoneSource->lowBatteryNotification()
+              m_phoneSource->lowBatteryNotification() && m_controller
                       && m_controller->shouldBatteryWarningBeShown(
                               m_phoneSource->deviceBatteryLevel()));
 }
@@ -197,12 +197,13 @@ void HmiPhoneGlobalStateHandler::showPhoneDoorNoCallOpenLinklossTest(QEvent *)
 // exactly one of them, and the other is left at its default (blocked).
 void HmiPhoneGlobalStateHandler::newTextMessageTest(QEvent *)
 {
-    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == 0);
+    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == TextMessageAlert::None);
 }
 
 void HmiPhoneGlobalStateHandler::multipleNewTextMessagesTest(QEvent *)
 {
-    allowOnlyIf(m_multipleNewTextMessagesTransition, m_textMessageAlertState != 0);
+    allowOnlyIf(m_multipleNewTextMessagesTransition,
+                m_textMessageAlertState != TextMessageAlert::None);
 }
 
 void HmiPhoneGlobalStateHandler::requestedMessageDetailsReadyTest(QEvent *)

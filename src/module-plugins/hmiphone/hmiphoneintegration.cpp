@@ -4,6 +4,7 @@
 #include "hmiphoneglobalstatehandler.h"
 #include "hmiphoneintenthandler.h"
 #include "hmiphonepopupmanager.h"
+#include "hmiphonesettingshostedsubmodule.h"
 #include "phone_cmp.h"
 #include "phonemenustate.h"
 
@@ -45,7 +46,7 @@ HmiPhoneIntegration::HmiPhoneIntegration(QObject *parent)
     // Taking the shared instance here creates the popup manager before any phone state exists.
     , m_popupManager(HmiPhonePopupManager::instance())
     , m_globalStateHandler(nullptr)
-    , m_intentHandler(new HmiPhoneIntentHandler(m_controller, this))
+    , m_intentHandler(new HmiPhoneIntentHandler(m_controller.data(), this))
 {
     Taldris::HmiIntentManager::instance()->registerIntentHandler(m_intentHandler);
 }
@@ -112,6 +113,10 @@ void HmiPhoneIntegration::registerTypes()
 Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
 {
     qCDebug(hmiphone) << Q_FUNC_INFO;
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneIntegration: the controller is gone, no phone states built";
+        return nullptr;
+    }
     const QString rootStateId = rootStateIdentifier();
     auto *rootComponent = new Phone_Cmp(this, m_controller, rootStateId, parent);
     // The phone menu's entry and exit reach the views through the controller.
@@ -124,6 +129,9 @@ Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiSta
     if (rootComponent)
         Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
                                                                     2);
+    // The phone's pages in the settings module.
+    auto *settingsSubmodule = new HmiPhoneSettingsHostedSubmodule(m_controller, this);
+    Taldris::HmiSubmoduleProvider::instance()->registerHostedSubmodule(3, settingsSubmodule);
     return rootComponent;
 }
 

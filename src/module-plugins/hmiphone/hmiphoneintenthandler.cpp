@@ -2,6 +2,7 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphoneintegration.h"
 #include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
@@ -56,6 +57,10 @@ bool HmiPhoneIntentHandler::performAction(int action, const QVariantList &argume
     case CallNumber: {
         if (arguments.isEmpty() || !Mavrosk::BluetoothSource::instance()->deviceConnected())
             return false;
+        if (!m_controller) {
+            qCWarning(hmiphone) << "HmiPhoneIntentHandler: the controller is gone, no call placed";
+            return false;
+        }
         // A first argument that gives no number (a list, a map, an empty string) would dial
         // nothing while reporting a call as started: refuse it and leave the entered number.
         const QVariant &number = arguments.first();
