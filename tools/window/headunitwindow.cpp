@@ -46,7 +46,7 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
                                VirtualEventDispatcher *clock, ScenarioPlayer::PlayStep playStep,
                                Mode mode, QObject *parent)
     : QObject(parent)
-    , m_screen(new HeadUnitScreen(clock, this))
+    , m_screen(new HeadUnitScreen(clock, mode == OnScreen, this))
     , m_player(new ScenarioPlayer(std::move(playStep), mode == OnScreen, this))
     , m_trace(new QStringListModel(this))
 {
