@@ -424,7 +424,10 @@ void TestCallReactions::keys_data()
     const Outputs rejectWaiting = Outputs{out("event HmiPhone_RejectWaitingCall")} + rejected;
     const Outputs closeIncoming{out("popup-dismiss IncomingCall")};
     const Outputs closeWaiting{out("popup-dismiss WaitingCall")};
-    const Outputs phoneMenu{out("bridge phone.checkPhoneStatus"), out("view PhoneMenu")};
+    // Entering the phone menu also takes the voice-service message away.
+    const Outputs phoneMenu{out("bridge phone.checkPhoneStatus"), out("view PhoneMenu"),
+                            out("transient-hide PhoneVoiceServiceActivatedTransientMsg"),
+                            out("popup-dismiss PhoneVoiceServiceActivatedPopup")};
     const Outputs phoneSection = Outputs{out("view-request Root")} + phoneMenu;
     const Outputs endCall{out("bridge phone.endCall")};
     const Outputs swapCall{out("bridge phone.swapCall")};

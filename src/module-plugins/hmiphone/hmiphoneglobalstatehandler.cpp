@@ -10,10 +10,14 @@
 #include "phone_cmp.h"
 #include "phonebook_cmp.h"
 #include "phonecall_cmp.h"
+#include "phonesms_cmp.h"
 #include "phonestatusalerts.h"
 
+#include <brisken/conditionalshowtransientorpopuprequest.h>
 #include <brisken/datastore.h>
 #include <brisken/dismisspopup.h>
+#include <brisken/hidetransientrequest.h>
+#include <brisken/showtransientorpopuprequest.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
 #include <brisken/viewmanager.h>
@@ -35,6 +39,7 @@
 #include <quorvel/popupstate.h>
 #include <taldris/hardkeycontroller.h>
 #include <taldris/hmiintentmanager.h>
+#include <taldris/hmiintentrequest.h>
 
 #include <QTimer>
 #include <QVector>
@@ -288,11 +293,25 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.event(Events::HmiPhone_CancelRedialRequest, popup(Views::Redial)).run(&H::cancelRedialRequest);
     chart.event(Events::HmiPhone_CallEndConfirmed, popup(Views::CallEnded)).run(&H::callEndConfirmed);
 
-    // [the five "NewTextMessageAlert2" rows; the "PhoneSmsTextMessagingOff" row]
+    // "NewTextMessageAlert2": hear it, stop, hide, or leave for the message or the replies.
+    chart.event(Events::HmiPhone_HearNewTextMessage, m_newTextMessageAlertPopup).run(&H::hearNewTextMessageAlert);
+    chart.event(Events::HmiPhone_StopHearNewTextMessage, m_newTextMessageAlertPopup).run(&H::stopHearNewTextMessageAlert);
+    chart.event(Events::HmiPhone_HideNewTextMessageAlert, m_newTextMessageAlertPopup).run(&H::hideNewTextMessageAlert);
+    chart.event(Events::HmiPhone_ViewNewTextMessage, m_newTextMessageAlertPopup)
+            .to(phoneCmp->phoneSmsViewState()).run(&H::viewNewTextMessageAlert);
+    chart.event(Events::HmiPhone_ReplyNewTextMessage, m_newTextMessageAlertPopup).to(phoneCmp->phoneSmsReplyViewState());
+
+    // "PhoneSmsTextMessagingOff" closes itself once messaging is turned on.
+    chart.change(phone, "messageNotificationEnabled", {false}, true, popup(Views::PhoneSmsTextMessagingOff))
+            .run(pm, &PM::hideTextMessagingOff);
 
     // --- Device and calls --------------------------------------------------------------------
 
-    // ["HmiPhone_AddPhoneRequest"; displayPairingPopup()]
+    // Adding a phone: from the phone's screens, or when the voice system asks for the pairing.
+    chart.event(Events::HmiPhone_AddPhoneRequest, phoneCmp).run(&H::addPhoneRequested).list(7);
+    chart.signal(m_speechSource, &Mavrosk::SpeechSource::displayPairingPopup).voiceEvent()
+            .run(Taldris::HmiIntentRequest(14, {ModuleName}, false, true, QVariant())).list(8);
+
     chart.event(Events::HmiPhone_EndCallRequest).run(&H::endCall).list(9);
 
     // The phone rings: two guarded transitions on the same change of "incomingCall" split the
@@ -336,14 +355,28 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
             .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
     chart.change(phone, "privateMode", {}, 1).run(&H::hideCallKeyPad).list(16);
 
-    // ["phoneBookStatus": becomes 2, leaves 2, 2 to 1]
+    // The contacts download starts, stops, and finishes (2 to 1 is both).
+    chart.change(phone, "phoneBookStatus", {}, 2)
+            .run(&H::showPhonebookDownloadInitiatedTransientMessage).list(84);
+    chart.change(phone, "phoneBookStatus", {2}, QVariant())
+            .run(&H::hidePhonePhonebookDownloadInitiatedTransientMessage).list(85);
+    chart.change(phone, "phoneBookStatus", {2}, 1)
+            .run(&H::handlePhonebookDownloadCompleteDisplay).list(83);
+    chart.event(Events::HmiPhone_RetryPhnBookDownloadAccessRequest)
+            .run(&H::handleRetryPhnBookDownloadContactAccess).list(92);
+    chart.event(Events::HmiPhone_RetryAutomaticContactDownloadRequest)
+            .run(&H::handleRetryPhnBookAutomaticContactDownload).list(93);
 
     // Dialling failures.
     chart.event(Events::HmiPhone_PhoneIssueFixRequest).run(pm, &PM::showDeviceIssueFixHint).list(32);
     chart.intSignal(phone, &PhoneSource::phoneDialingFailed, 1).run(&H::handleDialingFailure).list(33);
     chart.intSignal(phone, &PhoneSource::phoneDialingFailed, 0).run(pm, &PM::showNoCellularSignal).list(34);
 
-    // ["HmiPhone_ShowSiriNotEnabledRequest"; phoneSiriSCOchannelNotActiveReceived()]
+    // Siri is not available.
+    chart.event(Events::HmiPhone_ShowSiriNotEnabledRequest)
+            .run(pm, &PM::showSiriNotEnabledErrorPopup).list(101);
+    chart.signal(phone, &PhoneSource::phoneSiriSCOchannelNotActiveReceived)
+            .run(pm, &PM::showSiriNotEnabledErrorPopup).list(102);
     chart.event(Events::HmiPhone_StopAnswering).run(&H::stopAnswering).list(39);
 
     // --- Keys --------------------------------------------------------------------------------
@@ -404,17 +437,130 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     // Roaming confirmation.
     chart.event(Events::HmiPhone_ConfirmRoamingCall).run(&H::roamingCallConfirmed).list(35);
     chart.event(Events::HmiPhone_CancelRoamingCall).run(&H::roamingCallCancelled).list(36);
-    // ["deviceBatteryLevel"]
+    chart.property(phone, "deviceBatteryLevel").keep(m_batteryLevelTransition)
+            .guard(&H::batteryLevelTransitionEventTest).run(pm, &PM::showBatteryLow).list(37);
     chart.event(Events::HmiPhone_ShowStatusBarAlertsRequest).to(phoneCmp->phoneStatusAlerts()).list(38);
-    // [the five text-message request and status rows; "status" to and from 12; link loss and
-    // reconnection; new message, listen and message details]
+    // Opening the text messages: with messaging on, the phone's message access is checked;
+    // then the messages in memory open at once, the others after the status check.
+    chart.event(Events::HmiPhone_ShowSmsRequest).keep(m_smsNotificationDisabledTransition)
+            .guard(&H::smsMessageNotificationNotEnabledTest).run(pm, &PM::showTextMessagingOff).list(96);
+    chart.event(Events::HmiPhone_ShowSmsRequest).keep(m_smsNotificationEnabledTransition)
+            .guard(&H::smsMessageNotificationEnabledTest).run(&H::smsCheckPrerequisites).list(95);
+    chart.event(Events::HmiPhone_ShowSmsStatus).keep(m_smsInMemoryTransition)
+            .guard(&H::smsMessagesInMemoryTest).to(phoneCmp->phoneSmsCompositeState()).list(97);
+    chart.event(Events::HmiPhone_ShowSmsStatus).keep(m_smsNotInMemoryTransition)
+            .guard(&H::smsMessagesNotInMemoryTest).run(&H::smsCheckStatus).list(98);
+    chart.event(Events::HmiPhone_ShowSmsIphoneRequest).keep(m_smsIphoneTransition)
+            .to(phoneCmp->phoneSmsCompositeState()).list(112);
+    // The call moves to the handset (stand-by) and back.
+    chart.property(phone, "status").parallelExclusive(0).keep(m_standbyTransition)
+            .guard(&H::standbyTransitionEventTest).run(pm, &PM::showTransferToPhone).list(40);
+    chart.change(phone, "status", {12}, QVariant()).parallelExclusive(0)
+            .run(pm, &PM::hideTransferToPhone).list(41);
+    // The link drops: the popup during a call, the reconnect notice without one; the door opened
+    // after a failed reconnection; the phone back.
+    chart.guardedSignal(phone, &PhoneSource::nonUserDeviceDisconnectReceived)
+            .keep(m_connectionLostTransition).guard(&H::showPhoneConnectionLostTest)
+            .run(pm, &PM::showPhoneConnectionLost).list(42);
+    chart.guardedSignal(phone, &PhoneSource::nonUserDeviceDisconnectReceived)
+            .keep(m_attemptingReconnectTransition).guard(&H::showPhoneAttemptingReconnectTest)
+            .run(&H::showPhoneAttemptingReconnectTransient).list(43);
+    chart.change(m_bluetoothSource, "deviceConnected", {false}, true)
+            .run(&H::handleLinklossReconnectSuccessTransition).list(91);
+    chart.guardedSignal(phone, &PhoneSource::phoneDriverDoorOpenLinkLossReconnectFailedReceived)
+            .keep(m_doorOpenLinklossTransition).guard(&H::showPhoneDoorOpenLinklossTest)
+            .run(pm, &PM::showPhoneConnectionLost).run(pm, &PM::hideSendTextMessage).list(88);
+    chart.guardedSignal(phone, &PhoneSource::phoneDriverDoorOpenLinkLossReconnectFailedReceived)
+            .keep(m_doorNoCallOpenLinklossTransition).guard(&H::showPhoneDoorNoCallOpenLinklossTest)
+            .run(pm, &PM::showUnableToConnect).run(pm, &PM::hideSendTextMessage).list(89);
+    chart.signal(phone, &PhoneSource::deviceReconnectFailReceived)
+            .run(pm, &PM::showUnableToConnect).list(75);
+    // New messages: the alert state picks the single or the multiple alert. Reading aloud: the
+    // new message once hear-it is pressed, a message of the list once its details are in.
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageAlert).keep(m_newTextMessageTransition)
+            .guard(&H::newTextMessageTest).run(&H::processNewTextMessageAlert).list(44);
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageAlert).keep(m_multipleNewTextMessagesTransition)
+            .guard(&H::multipleNewTextMessagesTest).run(&H::processNewTextMessageAlert).list(51);
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageDetailsReady).keep(m_smsNewTextHearItTransition)
+            .guard(&H::smsNewTextHearitEventTest).run(&H::handleSmsNewTextHearitRequest).list(46);
+    chart.signal(phone, &PhoneSource::listenToMessageRequested).run(&H::handleListenMessageRequest).list(49);
+    chart.guardedSignal(phone, &PhoneSource::textMessageDetailsReady).keep(m_requestedMessageDetailsReadyTransition)
+            .guard(&H::requestedMessageDetailsReadyTest).run(&H::handleRequestedMessageDetailsReady).list(50);
+    chart.signal(phone, &PhoneSource::showMessageListRequested).voiceEvent()
+            .to(phoneCmp->phoneSmsCompositeState()).list(48);
+    chart.signal(phone, &PhoneSource::phoneSmsNewTextClusterHearItRequestReceived)
+            .run(&H::hearNewTextMessageAlert).list(86);
+    chart.signal(phone, &PhoneSource::phoneSmsNewTextClusterIgnoreRequestReceived)
+            .run(pm, &PM::newTextMessageAlert2Hide).list(87);
     // The root component dials, or asks for the roaming warning first.
     chart.event(Events::HmiPhone_MakeCallRequest).run(phoneCmp, &Phone_Cmp::makeCall).list(47);
-    // [reply and send; deviceConnectedChanged(bool)]
+    // Replying and sending: the replies, the reply chosen by voice, its confirmation, the send
+    // and its retries. The outcome is heard while the progress popup is up, and that popup
+    // closes when the connection changes.
+    chart.signal(phone, &PhoneSource::showReplyMessagesRequested)
+            .to(phoneCmp->phoneSmsReplyViewState()).run(pm, &PM::newTextMessageAlert2Hide).list(52);
+    chart.signal(phone, &PhoneSource::replyMessageLineNoChanged).run(&H::handleVRSendReplyMessage).list(54);
+    chart.event(Events::HmiPhoneSms_SendTextMessage, phoneCmp->phoneSmsReplyViewState())
+            .run(pm, &PM::showSendTextMessage).list(53);
+    chart.event(Events::HmiPhoneSms_InitiateSendTextMessage).run(&H::handleSendTextMessageRequest).list(56);
+    chart.signal(phone, &PhoneSource::sendMessageRequested).run(&H::handleSendTextMessageRequest).list(62);
+    chart.signal(phone, &PhoneSource::cancelSendMessageRequested).run(pm, &PM::hideSendTextMessage).list(63);
+    chart.event(Events::HmiPhoneSms_RetrySendTextMessage).run(&H::handleRetrySendTextMessage).list(61);
+    PopupState *sendProgress = popup(Views::PhoneSmsSendTextMessageProgress);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Sent, sendProgress)
+            .run(&H::handleSendTextMessageSuccess).list(57);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Failed, sendProgress)
+            .run(&H::handleSendTextMessageFailure).list(58);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NetworkFailure, sendProgress)
+            .run(&H::handleSendTextMessageNetworkFailure).list(59);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NotSent, sendProgress)
+            .run(&H::handleSendTextMessageFailure).list(60);
+    chart.signal(phone, &PhoneSource::sendMessageNoResponseFromPhoneAlert)
+            .run(&H::handleSendMessageNoResponseFromPhone).list(113);
+    chart.signal(m_bluetoothSource, &Mavrosk::BluetoothSource::deviceConnectedChanged)
+            .dismisses(sendProgress).list(107);
 
     // --- Extended mode, errors and screens asked for from elsewhere --------------------------
 
-    // [extended mode and its timer; DTMF, audio, connection and contacts errors]
+    // Extended mode, heard while the stand-by popup is up; the countdown runs on after it closes.
+    PopupState *standby = popup(Views::PhoneCallStandByModePopup);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 2, standby)
+            .run(&H::handleExtendedModeChangeRequest).list(71);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 3, standby)
+            .run(&H::handleExtendedModeChangeRequest).list(72);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 1, standby)
+            .run(pm, &PM::hidePhoneCallStandByModePopup).run(&H::clearExtendedModeTimer)
+            .run(&H::handleExtendedModeChangeRequest).list(69);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 0, standby)
+            .run(pm, &PM::hidePhoneCallStandByModePopup).run(&H::clearExtendedModeTimer).list(73);
+    chart.event(Events::HmiPhone_PrivacyRequestOn, standby)
+            .run(phone, &PhoneSource::togglePrivacyMode).run(&H::clearExtendedModeTimer).list(70);
+    chart.event(Events::HmiPhone_ClearExtendedModeTimer, standby)
+            .run(&H::clearExtendedModeTimer).list(94);
+    m_extendedModeTimer = new QTimer(this);
+    m_extendedModeTimer->setInterval(60000);
+    connect(m_extendedModeTimer, &QTimer::timeout, this, &H::extendedModeTimerMinuteElapsed);
+
+    // Errors: those of a call only while one is connected.
+    chart.guardedSignal(phone, &PhoneSource::dtmfKeyPressNoResponseErrorReceived)
+            .keep(m_dtmfNoResponseErrorTransition).guard(&H::dtmfKeyPressNoResponseErrorEventTest)
+            .run(pm, &PM::showDTMFKeyPressNoResponseErrorPopup).list(67);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioTransferErrorReceived)
+            .keep(m_audioTransferErrorTransition).guard(&H::phoneAudioTransferErrorEventTest)
+            .run(pm, &PM::showPhoneAudioTransferErrorPopup).list(68);
+    chart.signal(phone, &PhoneSource::unstableDeviceConnectionWithKovaReceived)
+            .run(pm, &PM::showUnstableConnectionWithKovaPopup).list(74);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioHandsfreeErrorReceived)
+            .keep(m_audioHandsfreeErrorTransition).guard(&H::phoneAudioHandsfreeErrorEventTest)
+            .run(pm, &PM::showHandsFreeError).list(78);
+    chart.signal(phone, &PhoneSource::phoneSiriNoResponseErrorReceived)
+            .run(pm, &PM::showPhoneSiriNoResponseErrorPopup).list(80);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioInternalErrorReceived)
+            .keep(m_audioInternalErrorTransition).guard(&H::phoneAudioInternalErrorEventTest)
+            .run(pm, &PM::showPhoneSiriNoResponseErrorPopup).list(81);
+    chart.signal(phone, &PhoneSource::phoneContactsTooLargeErrorReceived)
+            .run(pm, &PM::showPhoneContactsTooLargeErrorPopup).list(82);
+
     chart.event(Events::HmiPhone_ShowConnectToDevice).to(phoneCmp->addPhoneState()).list(90);
     chart.event(Events::HmiPhone_RootStateRequest).to(phoneCmp).list(99);
     chart.event(Events::HmiPhone_RoamingMode).run(&H::handleRoamingWarning).list(100);
@@ -422,9 +568,42 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
 
     // --- Voice service and contacts ----------------------------------------------------------
 
-    // [voice service, with the status-bar controller when there is one]
+    // The phone's voice assistant listens: a message while it does, offered again when the phone
+    // menu is left or the status bar comes or goes, removed when it stops or the menu is entered.
+    // What needs the status bar is wired only when there is one; the popup goes in any case.
+    auto siriOn = chart.change(phone, "siriActive", {false}, true).parallelExclusive(2).list(103, L2);
+    auto siriOff = chart.change(phone, "siriActive", {true}, false).list(104, L2);
+    auto voiceOn = chart.change(phone, "phoneVoiceServiceActive", {false}, true)
+            .parallelExclusive(2).list(105, L2);
+    auto voiceOff = chart.change(phone, "phoneVoiceServiceActive", {true}, false).list(106, L2);
+    auto menuExited = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuExited).list(108, L2);
+    auto menuEntered = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuEntered).list(109, L2);
+    const QString &voiceMessage = Transients::PhoneVoiceServiceActivatedTransientMsg;
+    const QString &voicePopup = Views::PhoneVoiceServiceActivatedPopup;
+    if (Brisken::StatusBarController *statusBar = statusBarController()) {
+        const Brisken::ConditionalShowTransientOrPopupRequest whileSiri(
+                statusBar, voiceMessage, voicePopup, phone, "siriActive", true);
+        const Brisken::ConditionalShowTransientOrPopupRequest whileVoiceService(
+                statusBar, voiceMessage, voicePopup, phone, "phoneVoiceServiceActive", true);
+        const Brisken::ShowTransientOrPopupRequest show(statusBar, voiceMessage, voicePopup);
+        const Brisken::HideTransientRequest hide(statusBar, voiceMessage);
+        chart.signal(statusBar, &Brisken::StatusBarController::statusBarVisibleChanged)
+                .run(whileSiri).run(whileVoiceService).list(5, L2);
+        siriOn.run(show);
+        siriOff.run(hide);
+        voiceOn.run(show);
+        voiceOff.run(hide);
+        menuExited.run(whileSiri).run(whileVoiceService);
+        menuEntered.run(hide);
+    }
+    siriOff.run(Brisken::DismissPopup(voicePopup));
+    voiceOff.run(Brisken::DismissPopup(voicePopup));
+    menuEntered.run(Brisken::DismissPopup(voicePopup));
     chart.event(Events::HmiPhone_ShowContactsRequest).to(phoneCmp->phoneBookCompositeState()).list(6, L2);
-    // [the two dismissing rows of "PhoneSmsSendTextMessage"]
+    // The send confirmation closes when a new message arrives or the message list is asked for.
+    PopupState *sendConfirmation = popup(Views::PhoneSmsSendTextMessage);
+    chart.signal(phone, &PhoneSource::newTextMessageAlert, sendConfirmation).dismisses(sendConfirmation);
+    chart.signal(phone, &PhoneSource::showMessageListRequested, sendConfirmation).dismisses(sendConfirmation);
 
     // clang-format on
 }
@@ -634,52 +813,6 @@ void HmiPhoneGlobalStateHandler::showPhoneDialingTransientMessage()
 void HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage()
 {
     hideTransient(Transients::PhoneOutgoingDialing);
-}
-
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadInitiatedTransientMessage()
-{
-    requestTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::hidePhonePhonebookDownloadInitiatedTransientMessage()
-{
-    hideTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadCompleteTransientMessage()
-{
-    if (m_bluetoothSource->deviceConnected())
-        requestTransient(Transients::PhonebookDownloadComplete);
-}
-
-// --- Text-message alert bookkeeping ------------------------------------------------------------
-
-void HmiPhoneGlobalStateHandler::enableSingleMessageState()
-{
-    m_textMessageAlertState = 1;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout()
-{
-    // A state of 2 was set by the multiple-messages alert replacing this one: it stays.
-    if (m_textMessageAlertState == 1)
-        m_textMessageAlertState = 0;
-    if (m_phoneSource->hearItPressed()) {
-        m_phoneSource->requestTextMessagesInbox();
-        m_phoneSource->setHearItPressed(false);
-    }
-}
-
-void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
-{
-    m_textMessageAlertState = 2;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
-{
-    m_textMessageAlertState = 0;
-    if (m_controller)
-        m_controller->resetRecievedTextMessageCount();
 }
 
 } // namespace HmiPhone
