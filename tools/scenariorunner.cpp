@@ -58,9 +58,11 @@ bool valuesMatch(const QJsonValue &actual, const QJsonValue &expected)
     return actual == expected;
 }
 
-QStringList shownPopups()
+// "popup"/"nopopup": open, on top or covered; "top": shown on top of its region.
+QStringList popupsFor(const QString &key)
 {
-    return Brisken::ViewController::instance()->shownPopups();
+    Brisken::ViewController *views = Brisken::ViewController::instance();
+    return key == QLatin1String("top") ? views->shownPopups() : views->openPopups();
 }
 
 } // namespace
@@ -393,16 +395,20 @@ QString ScenarioRunner::checkOne(const QString &key, const QJsonValue &expected,
         return QStringLiteral("expected %1view %2, on screen: %3")
                 .arg(no, wanted, active.isEmpty() ? QStringLiteral("none") : active);
     }
-    if (key == QLatin1String("popup") || key == QLatin1String("nopopup")) {
-        const QStringList popups = shownPopups();
-        bool shown = false;
+    if (key == QLatin1String("popup") || key == QLatin1String("nopopup")
+        || key == QLatin1String("top")) {
+        const QStringList popups = popupsFor(key);
+        bool found = false;
         for (const QString &popup : popups)
-            shown = shown || namesMatch(popup, wanted);
-        const bool wantShown = (key == QLatin1String("popup")) != negated;
-        if (shown == wantShown)
+            found = found || namesMatch(popup, wanted);
+        const bool wanting = (key != QLatin1String("nopopup")) != negated;
+        if (found == wanting)
             return QString();
-        return QStringLiteral("expected %1popup %2, shown: %3")
-                .arg(wantShown ? QString() : QStringLiteral("no "), wanted,
+        const bool top = key == QLatin1String("top");
+        return QStringLiteral("expected %1%2 %3, %4: %5")
+                .arg(wanting ? QString() : QStringLiteral("no "),
+                     top ? QStringLiteral("popup on top") : QStringLiteral("open popup"), wanted,
+                     top ? QStringLiteral("on top") : QStringLiteral("open"),
                      popups.isEmpty() ? QStringLiteral("none") : popups.join(QStringLiteral(", ")));
     }
     if (key == QLatin1String("state")) {
