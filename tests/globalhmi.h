@@ -56,14 +56,17 @@ public:
     static qint64 post(const QString &event) { return TestSupport::post(event); }
 
     // What a driver or the phone noticed since `since`, in order, as "kind name": popups asked
-    // for and dismissed (by view name), transients, events posted and commands to the phone.
+    // for and dismissed, views asked for and shown (by view name), transients, events posted,
+    // commands to the phone and keys handed back to the platform's seek function.
     static QStringList outputsSince(qint64 since)
     {
         QStringList outputs;
         for (const auto &entry : Platform::Journal::instance()->entriesSince(since)) {
             QString what;
             if (entry.kind == QLatin1String("popup-request")
-                || entry.kind == QLatin1String("popup-dismiss"))
+                || entry.kind == QLatin1String("popup-dismiss")
+                || entry.kind == QLatin1String("view-request")
+                || entry.kind == QLatin1String("view"))
                 what = entry.fields.value(QStringLiteral("id"))
                                .toString()
                                .section(QLatin1Char('.'), 1);
@@ -71,7 +74,8 @@ public:
                 what = entry.fields.value(QStringLiteral("name")).toString();
             else if (entry.kind == QLatin1String("event"))
                 what = entry.fields.value(QStringLiteral("name")).toString();
-            else if (entry.kind == QLatin1String("bridge"))
+            else if (entry.kind == QLatin1String("bridge")
+                     || entry.kind == QLatin1String("hardkey"))
                 what = entry.fields.value(QStringLiteral("call")).toString();
             else
                 continue;

@@ -130,8 +130,9 @@ private:
                 s_original(type, context, message);
             return;
         }
-        static const char *const watched[] = {"QStateMachine", "QState::", "QSignalTransition",
-                                              "No such signal", "Missing initial state"};
+        static const char *const watched[] = {"QStateMachine",         "QState::",
+                                              "QSignalTransition",     "No such signal",
+                                              "Missing initial state", "without its transition"};
         if (type == QtWarningMsg)
             for (const char *text : watched)
                 if (message.contains(QLatin1String(text))) {

@@ -5,6 +5,8 @@
 #include "hmiphoneevents.h"
 
 #include <brisken/statusbarcontroller.h>
+#include <mavrosk/eaphonesource.h>
+#include <mavrosk/keysource.h>
 #include <mavrosk/projectionsource.h>
 #include <mavrosk/speechsource.h>
 
@@ -24,6 +26,8 @@ private slots:
     void answer_data();
     void answer();
     void waitingCall();
+    void ringingEnds_data();
+    void ringingEnds();
     void missedCall_data();
     void missedCall();
     void dialingFailures_data();
@@ -33,6 +37,8 @@ private slots:
     void roamingConfirmation_data();
     void roamingConfirmation();
     void incomingCallRoadThroughThePlugin();
+    void keys_data();
+    void keys();
 
 private:
     Mavrosk::PhoneSource *phone() const { return GlobalHmi::phone(); }
@@ -154,6 +160,39 @@ void TestCallReactions::waitingCall()
     QVERIFY(GlobalHmi::shown(QStringLiteral("WaitingCall")));
     emit phone()->phoneWaitingCallRemoteRejection();
     TestSupport::processUntilIdle();
+    QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
+}
+
+void TestCallReactions::ringingEnds_data()
+{
+    QTest::addColumn<bool>("duringCall");
+    QTest::addColumn<bool>("connectedFirst");
+
+    QTest::addRow("answered on the handset, connected first") << false << true;
+    QTest::addRow("answered on the handset, ringing ended first") << false << false;
+    QTest::addRow("waiting call ends") << true << false;
+}
+
+// However the ringing ends, and in whichever order the phone reports it, no call popup stays.
+void TestCallReactions::ringingEnds()
+{
+    QFETCH(bool, duringCall);
+    QFETCH(bool, connectedFirst);
+    phone()->setCallConnected(duringCall);
+    QVERIFY(m_hmi->run());
+    phone()->setIncomingCall(true);
+    TestSupport::processUntilIdle();
+    QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
+                                        : QStringLiteral("IncomingCall")));
+
+    for (const bool connectNow : {connectedFirst, !connectedFirst}) {
+        if (connectNow)
+            phone()->setCallConnected(true);
+        else
+            phone()->setIncomingCall(false);
+        TestSupport::processUntilIdle();
+    }
+    QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
     QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
 }
 
@@ -347,6 +386,172 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
     QCOMPARE(TestSupport::journalValues(QStringLiteral("back"), QStringLiteral("steps"), since),
              QStringList{QStringLiteral("1")});
     QCOMPARE(Brisken::ViewController::instance()->activeView(), QStringLiteral("HOST.Home"));
+}
+
+namespace {
+
+enum Situation { Idle, Ringing, Waiting, OneCall, TwoCalls, Dialling };
+enum Condition { Private = 1, Blocked = 2, Projection = 4, Rendering = 8, DoNotDisturb = 16 };
+
+} // namespace
+
+// What each phone key does in each call situation, as the HMI and the phone see it. Every output
+// a key leads to is listed, so a key reaching the wrong slot, or two slots, shows.
+void TestCallReactions::keys_data()
+{
+    QTest::addColumn<int>("situation");
+    QTest::addColumn<int>("conditions");
+    QTest::addColumn<int>("key");
+    QTest::addColumn<int>("kind");
+    QTest::addColumn<Outputs>("outputs");
+
+    const auto row = [](const char *tag, Situation situation, int conditions, int key, int kind,
+                        const Outputs &outputs) {
+        QTest::newRow(tag) << int(situation) << conditions << key << kind << outputs;
+    };
+    const auto out = [](const char *line) { return QString::fromLatin1(line); };
+    const auto hardKey = [&](const char *call) { return Outputs{out("hardkey ") + out(call)}; };
+    const Outputs accepted{out("popup-dismiss IncomingCall"),
+                           out("bridge phone.acceptIncomingCall"),
+                           out("transient PhoneAcceptedIncomingCall")};
+    const Outputs rejected{out("popup-dismiss IncomingCall"),
+                           out("bridge phone.rejectIncomingCall"),
+                           out("transient PhoneRejectedIncomingCall")};
+    const Outputs acceptEvent = Outputs{out("event HmiPhone_AcceptIncomingCall")} + accepted;
+    const Outputs rejectEvent = Outputs{out("event HmiPhone_RejectIncomingCall")} + rejected;
+    const Outputs acceptWaiting = Outputs{out("event HmiPhone_AcceptWaitingCall")} + accepted;
+    const Outputs rejectWaiting = Outputs{out("event HmiPhone_RejectWaitingCall")} + rejected;
+    const Outputs closeIncoming{out("popup-dismiss IncomingCall")};
+    const Outputs closeWaiting{out("popup-dismiss WaitingCall")};
+    // Entering the phone menu also takes the voice-service message away.
+    const Outputs phoneMenu{out("bridge phone.checkPhoneStatus"), out("view PhoneMenu"),
+                            out("transient-hide PhoneVoiceServiceActivatedTransientMsg"),
+                            out("popup-dismiss PhoneVoiceServiceActivatedPopup")};
+    const Outputs phoneSection = Outputs{out("view-request Root")} + phoneMenu;
+    const Outputs endCall{out("bridge phone.endCall")};
+    const Outputs swapCall{out("bridge phone.swapCall")};
+
+    row("idle: phone key opens the phone", Idle, 0, 12, 2, phoneMenu);
+    row("idle: phone key press", Idle, 0, 12, 1, {});
+    row("idle: phone key long", Idle, 0, 12, 3, {});
+    row("idle: 77 seeks left", Idle, 0, 77, 1, hardKey("processCombinedSeekLeftKey"));
+    row("idle: 78 seeks right", Idle, 0, 78, 1, hardKey("processCombinedSeekRightKey"));
+    row("idle: send", Idle, 0, 49, 1, {});
+    row("idle: end opens the phone", Idle, 0, 50, 1, phoneSection);
+    row("idle: end 80 opens the phone", Idle, 0, 80, 1, phoneSection);
+    row("idle: 90 short", Idle, 0, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("idle: 91 short", Idle, 0, 91, 2, hardKey("processSWCSeekUpShortPress"));
+    row("idle: 90 long", Idle, 0, 90, 3, hardKey("processSWCSeekDownLongPress"));
+    row("idle: 90 release", Idle, 0, 90, 4, hardKey("processSWCSeekDownLongRelease"));
+    row("idle: 91 long", Idle, 0, 91, 3, hardKey("processSWCSeekUpLongPress"));
+    row("idle: 91 release", Idle, 0, 91, 4, hardKey("processSWCSeekUpLongRelease"));
+    row("idle: 90 press", Idle, 0, 90, 1, {});
+    row("idle: unknown key", Idle, 0, 13, 2, {});
+    row("idle: unknown kind", Idle, 0, 77, 9, {});
+    row("idle, projection: phone key", Idle, Projection, 12, 2, {});
+    row("idle, projection: 77", Idle, Projection, 77, 1, {});
+    row("idle, projection: 91 release", Idle, Projection, 91, 4, {});
+    row("idle, blocked: 77", Idle, Blocked, 77, 1, {});
+    row("idle, blocked: end", Idle, Blocked, 50, 1, {});
+    row("idle, blocked: 90 long", Idle, Blocked, 90, 3, hardKey("processSWCSeekDownLongPress"));
+    row("ringing: phone key accepts", Ringing, 0, 12, 2, accepted + closeIncoming);
+    row("ringing: phone key long rejects", Ringing, 0, 12, 3, rejected + closeIncoming);
+    row("ringing: 77", Ringing, 0, 77, 1, acceptEvent);
+    row("ringing: 78", Ringing, 0, 78, 1, rejectEvent);
+    row("ringing: send 79", Ringing, 0, 79, 1, acceptEvent);
+    row("ringing: end 50", Ringing, 0, 50, 1, rejectEvent);
+    row("ringing: 90 short", Ringing, 0, 90, 2, acceptEvent);
+    row("ringing: 91 short", Ringing, 0, 91, 2, rejectEvent);
+    row("ringing, projection: phone key", Ringing, Projection, 12, 2, {});
+    row("ringing, projection: phone key long", Ringing, Projection, 12, 3, {});
+    row("ringing, rendering: phone key", Ringing, Rendering, 12, 2, accepted + closeIncoming);
+    row("ringing, rendering: send", Ringing, Rendering, 49, 1, {});
+    row("ringing, do not disturb: phone key", Ringing, DoNotDisturb, 12, 2, {});
+    row("ringing, blocked: 77", Ringing, Blocked, 77, 1, {});
+    row("ringing, blocked: phone key", Ringing, Blocked, 12, 2, accepted + closeIncoming);
+    row("waiting: phone key accepts", Waiting, 0, 12, 2, accepted + closeWaiting);
+    row("waiting: phone key long rejects", Waiting, 0, 12, 3, rejected + closeWaiting);
+    row("waiting: 77", Waiting, 0, 77, 1, acceptWaiting);
+    row("waiting: 77 short", Waiting, 0, 77, 2, closeWaiting);
+    row("waiting: 78 rejects, then closes", Waiting, 0, 78, 1, rejectWaiting + closeWaiting);
+    row("waiting: 78 short", Waiting, 0, 78, 2, {});
+    row("waiting: send", Waiting, 0, 49, 1, acceptWaiting);
+    row("waiting: send 79 short", Waiting, 0, 79, 2, closeWaiting);
+    row("waiting: end 80", Waiting, 0, 80, 1, rejectWaiting);
+    row("waiting: end short", Waiting, 0, 50, 2, closeWaiting);
+    row("waiting: 90 accepts, then closes", Waiting, 0, 90, 2, acceptWaiting + closeWaiting);
+    row("waiting: 91 short", Waiting, 0, 91, 2, rejected + closeWaiting + rejectEvent);
+    row("waiting, rendering: send short", Waiting, Rendering, 49, 2, closeWaiting);
+    row("waiting, rendering: 77", Waiting, Rendering, 77, 1, {});
+    row("waiting, blocked: end", Waiting, Blocked, 50, 1, {});
+    row("one call: phone key", OneCall, 0, 12, 2, {});
+    row("one call: phone key long ends", OneCall, 0, 12, 3, endCall);
+    row("one call: 77", OneCall, 0, 77, 1, {});
+    row("one call: send", OneCall, 0, 49, 1, {});
+    row("one call: 78", OneCall, 0, 78, 1, endCall);
+    row("one call: end", OneCall, 0, 50, 1, endCall);
+    row("one call: 90 short", OneCall, 0, 90, 2, {});
+    row("one call: 91 short", OneCall, 0, 91, 2, endCall);
+    row("one call: 90 long", OneCall, 0, 90, 3, {});
+    row("one call: 91 long", OneCall, 0, 91, 3, endCall);
+    row("one call: 91 release", OneCall, 0, 91, 4, {});
+    row("one call, private: phone key long", OneCall, Private, 12, 3, {});
+    row("one call, private: 77", OneCall, Private, 77, 1, hardKey("processCombinedSeekLeftKey"));
+    row("one call, private: 78", OneCall, Private, 78, 1, hardKey("processCombinedSeekRightKey"));
+    row("one call, private: end", OneCall, Private, 80, 1, {});
+    row("one call, private: 90 short", OneCall, Private, 90, 2,
+        hardKey("processSWCSeekDownShortPress"));
+    row("one call, private: 91 long", OneCall, Private, 91, 3,
+        hardKey("processSWCSeekUpLongPress"));
+    row("one call, blocked: phone key long", OneCall, Blocked, 12, 3, {});
+    row("one call, blocked: 78", OneCall, Blocked, 78, 1, {});
+    row("one call, blocked: 91 long", OneCall, Blocked, 91, 3, endCall);
+    row("one call, projection: phone key long", OneCall, Projection, 12, 3, {});
+    row("two calls: phone key swaps", TwoCalls, 0, 12, 2, swapCall);
+    row("two calls: 77", TwoCalls, 0, 77, 1, swapCall);
+    row("two calls: send 79", TwoCalls, 0, 79, 1, swapCall);
+    row("two calls: 90 short", TwoCalls, 0, 90, 2, swapCall);
+    row("two calls: end", TwoCalls, 0, 50, 1, endCall);
+    row("two calls, private: phone key", TwoCalls, Private, 12, 2, {});
+    row("two calls, private: send", TwoCalls, Private, 49, 1, {});
+    row("two calls, blocked: phone key", TwoCalls, Blocked, 12, 2, swapCall);
+    row("two calls, blocked: send", TwoCalls, Blocked, 49, 1, {});
+    row("dialling: phone key long", Dialling, 0, 12, 3, endCall);
+    row("dialling: 77", Dialling, 0, 77, 1, hardKey("processCombinedSeekLeftKey"));
+    row("dialling: 78", Dialling, 0, 78, 1, endCall);
+    row("dialling: end 80", Dialling, 0, 80, 1, endCall);
+    row("dialling: 91 short", Dialling, 0, 91, 2, endCall);
+    row("dialling: 90 release", Dialling, 0, 90, 4, {});
+}
+
+void TestCallReactions::keys()
+{
+    QFETCH(int, situation);
+    QFETCH(int, conditions);
+    QFETCH(int, key);
+    QFETCH(int, kind);
+    QFETCH(Outputs, outputs);
+    const int status[] = {0, 0, 7, 7, 9, 3};
+    phone()->setStatus(status[situation]);
+    phone()->setCallConnected(situation >= Waiting && situation <= TwoCalls);
+    phone()->setMultipleCallsConnected(situation == TwoCalls);
+    phone()->setDialingInProgress(situation == Dialling);
+    phone()->setPrivateMode(conditions & Private);
+    phone()->setDoNotDisturb(conditions & DoNotDisturb);
+    Mavrosk::EAPhoneSource::instance()->setEventsBlocked(conditions & Blocked);
+    Mavrosk::ProjectionSource::instance()->setProjectionMode(
+            conditions & (Projection | Rendering) ? 1 : 0);
+    Mavrosk::ProjectionSource::instance()->setIsRendering(conditions & Rendering);
+    QVERIFY(m_hmi->run());
+    if (situation == Ringing || situation == Waiting) {
+        phone()->setIncomingCall(true);
+        TestSupport::processUntilIdle();
+    }
+
+    const qint64 since = GlobalHmi::mark();
+    Mavrosk::KeySource::instance()->sendKeyEvent(key, kind);
+    TestSupport::processUntilIdle();
+    QCOMPARE(GlobalHmi::outputsSince(since), outputs);
 }
 
 QTEST_GUILESS_MAIN(TestCallReactions)

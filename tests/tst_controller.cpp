@@ -11,6 +11,7 @@
 #include <QtTest>
 
 #include <functional>
+#include <limits>
 #include <memory>
 
 using HmiPhone::HmiPhoneController;
@@ -29,12 +30,14 @@ QStringList trace(qint64 since)
             since, {QStringLiteral("event"), QStringLiteral("intent"), QStringLiteral("bridge")});
 }
 
-// The alphabet bar A..E with start rows 0, -1, 10, 25, 40 over a contact list of 60 rows.
-void loadAlphabetBar()
+// The alphabet bar A..E with start rows 0, -1, 10, 25, 40 (or those given) over a contact list
+// of 60 rows.
+void loadAlphabetBar(QList<int> starts = {})
 {
     QVariantList rows;
-    const int starts[] = {0, -1, 10, 25, 40};
-    for (int i = 0; i < 5; ++i)
+    if (starts.isEmpty())
+        starts = {0, -1, 10, 25, 40};
+    for (int i = 0; i < starts.size(); ++i)
         rows.append(QVariantMap{{QStringLiteral("alphabet"), QString(QLatin1Char('A' + i))},
                                 {QStringLiteral("letterIndex"), starts[i]}});
     Mavrosk::PhoneSource::instance()->AlphabetIndexModel()->setRows(rows);
@@ -434,14 +437,33 @@ private slots:
         QTest::addColumn<int>("minRow");
         QTest::addColumn<int>("maxRow");
 
-        QTest::newRow("whole C section") << 12 << 15 << 4 << 60 << 10 << 24;
-        QTest::newRow("top of the list") << 0 << 3 << 4 << 60 << 0 << 9;
-        QTest::newRow("E section to the end") << 45 << 48 << 4 << 60 << 40 << 59;
-        QTest::newRow("five rows limit") << 12 << 15 << 1 << 60 << 10 << 14;
-        QTest::newRow("bottom row equals letter count") << 0 << 4 << 4 << 60 << 0 << 9;
-        QTest::newRow("top row below, bottom equals count") << 2 << 4 << 4 << 60 << 0 << 9;
-        QTest::newRow("whole short list on screen") << 0 << 29 << 10 << 30 << 0 << 29;
-        QTest::newRow("whole list, five pages at most") << 0 << 59 << 4 << 60 << 0 << 19;
+        QTest::addColumn<QList<int>>("starts"); // of A..E; empty for 0, -1, 10, 25, 40
+
+        const QList<int> ae;
+        const int intMin = std::numeric_limits<int>::min();
+        const int intMax = std::numeric_limits<int>::max();
+        // clang-format off
+        QTest::newRow("whole C section") << 12 << 15 << 4 << 60 << 10 << 24 << ae;
+        QTest::newRow("top of the list") << 0 << 3 << 4 << 60 << 0 << 9 << ae;
+        QTest::newRow("E section to the end") << 45 << 48 << 4 << 60 << 40 << 59 << ae;
+        QTest::newRow("five rows limit") << 12 << 15 << 1 << 60 << 10 << 14 << ae;
+        QTest::newRow("bottom row equals letter count") << 0 << 4 << 4 << 60 << 0 << 9 << ae;
+        QTest::newRow("top row below, bottom equals count") << 2 << 4 << 4 << 60 << 0 << 9 << ae;
+        QTest::newRow("whole short list on screen") << 0 << 29 << 10 << 30 << 0 << 29 << ae;
+        QTest::newRow("whole list, five pages at most") << 0 << 59 << 4 << 60 << 0 << 19 << ae;
+        // Arguments no view should pass, and starts no phone should send: the window stays
+        // inside the list and within five pages, without overflow.
+        QTest::newRow("five pages of a huge page size") << 0 << 5 << 1000000000 << 60 << 0 << 9 << ae;
+        QTest::newRow("page size 0 counts as 1") << 12 << 15 << 0 << 60 << 10 << 14 << ae;
+        QTest::newRow("largest rows, negative page size") << intMax << intMax << -1 << 60 << 55 << 59 << ae;
+        QTest::newRow("smallest bottom row") << 1 << intMin << 1 << 60 << 0 << 4 << ae;
+        QTest::newRow("bottom above top") << 15 << 12 << 4 << 60 << 10 << 24 << ae;
+        QTest::newRow("rows beyond the list") << 100 << 200 << 4 << 60 << 40 << 59 << ae;
+        QTest::newRow("empty list") << 0 << 0 << 4 << 0 << -1 << -1 << ae;
+        QTest::newRow("smallest start from the bridge") << 5 << 5 << 1 << 60 << 0 << 4 << QList<int>{intMin, -1, 10, 25, 40};
+        QTest::newRow("starts past the list") << 12 << 15 << 4 << 20 << 10 << 19 << QList<int>{0, -1, 10, intMax, 40};
+        QTest::newRow("starts that decrease") << 12 << 15 << 4 << 60 << 0 << 19 << QList<int>{40, -1, 25, 10, 0};
+        // clang-format on
     }
 
     void windowForVisibleRows()
@@ -452,7 +474,8 @@ private slots:
         QFETCH(int, listLength);
         QFETCH(int, minRow);
         QFETCH(int, maxRow);
-        loadAlphabetBar();
+        QFETCH(QList<int>, starts);
+        loadAlphabetBar(starts);
         Mavrosk::PhoneSource::instance()->phoneBook()->setListLength(listLength);
 
         m_controller->calculateDriverRestrictedPhonebookMinMaxRows(top, bottom, perPage);
@@ -477,6 +500,8 @@ private slots:
         QTest::newRow("long section gives 20 rows") << QVariantList{QStringLiteral("A"), 0, QStringLiteral("B"), 45} << QStringLiteral("A") << QList<int>{0, 19};
         QTest::newRow("Greek letters stay apart") << QVariantList{QString(QChar(0x391)), 0, QString(QChar(0x392)), 5} << QString(QChar(0x3B1)) << QList<int>{0, 4};
         QTest::newRow("Cyrillic does not match an empty entry") << QVariantList{QString(), 0, QStringLiteral("A"), 5} << QString(QChar(0x416)) << QList<int>{-1, -1};
+        QTest::newRow("smallest start from the bridge") << QVariantList{QStringLiteral("A"), std::numeric_limits<int>::min(), QStringLiteral("B"), 5} << QStringLiteral("A") << QList<int>{-1, -1};
+        QTest::newRow("next start before the letter's") << QVariantList{QStringLiteral("A"), 30, QStringLiteral("B"), 10} << QStringLiteral("A") << QList<int>{30, 30};
         QTest::newRow("CJK letter") << QVariantList{QString(QChar(0x4E00)), 0, QString(QChar(0x4E8C)), 8} << QString(QChar(0x4E00)) << QList<int>{0, 7};
         // clang-format on
     }

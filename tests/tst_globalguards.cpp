@@ -2,16 +2,10 @@
 // and whether the guarded transition then fires, seen through what the HMI shows.
 
 #include "globalhmi.h"
-#include "hmiphoneglobalstatehandler.h"
 
 #include <brisken/viewmanager.h>
-#include <mavrosk/keysource.h>
 #include <mavrosk/navsource.h>
 #include <mavrosk/projectionsource.h>
-#include <quorvel/hmistate.h>
-#include <quorvel/keysignaltransition.h>
-
-#include <QSignalSpy>
 
 using namespace HmiPhone;
 
@@ -49,8 +43,6 @@ private slots:
     void incomingCallAfterProjection();
     void callConnected_data();
     void callConnected();
-    void keyGuards_data();
-    void keyGuards();
 
 private:
     std::unique_ptr<GlobalHmi> m_hmi;
@@ -160,58 +152,6 @@ void TestGlobalGuards::callConnected()
     phone()->setStatus(callConnected ? 7 : 3);
     TestSupport::processUntilIdle();
     QCOMPARE(GlobalHmi::isActive(QStringLiteral("PhoneCallCmp")), callScreen);
-}
-
-void TestGlobalGuards::keyGuards_data()
-{
-    QTest::addColumn<QByteArray>("guard");
-    QTest::addColumn<int>("projectionMode");
-    QTest::addColumn<bool>("rendering");
-    QTest::addColumn<bool>("doNotDisturb");
-    QTest::addColumn<bool>("callConnected");
-    QTest::addColumn<bool>("fires");
-
-    // The phone key answering a ringing call.
-    const QByteArray ringing = SLOT(incomingCallKeySignalTransitionEventTest(QEvent *));
-    QTest::addRow("ringing") << ringing << 0 << false << false << false << true;
-    QTest::addRow("ringing during a call") << ringing << 0 << false << false << true << false;
-    QTest::addRow("ringing, projection 1") << ringing << 1 << false << false << false << false;
-    QTest::addRow("ringing, projection 1 rendering")
-            << ringing << 1 << true << false << false << true;
-    QTest::addRow("ringing, do not disturb") << ringing << 0 << false << true << false << false;
-    // The call and seek keys, which a projection keeps for itself.
-    const QByteArray seek = SLOT(isProjectionNotActive());
-    QTest::addRow("seek, no projection") << seek << 0 << true << false << false << true;
-    QTest::addRow("seek, projection 1") << seek << 1 << true << false << false << false;
-    QTest::addRow("seek, projection 2") << seek << 2 << false << false << false << false;
-}
-
-void TestGlobalGuards::keyGuards()
-{
-    QFETCH(QByteArray, guard);
-    QFETCH(int, projectionMode);
-    QFETCH(bool, rendering);
-    QFETCH(bool, doNotDisturb);
-    QFETCH(bool, callConnected);
-    QFETCH(bool, fires);
-    setProjection(projectionMode, rendering);
-    phone()->setDoNotDisturb(doNotDisturb);
-    phone()->setCallConnected(callConnected);
-    phone()->setIncomingCall(true);
-    QVERIFY(m_hmi->setUp());
-    auto *handler = m_hmi->host().integration()->findChild<HmiPhoneGlobalStateHandler *>();
-    QVERIFY(handler);
-    // A key transition of another part of the HMI, guarded by the handler's test.
-    auto *transition = new Quorvel::KeySignalTransition(
-            Mavrosk::KeySource::instance(), "2keyEvent(int, int)", 12, 2,
-            Quorvel::StateMachine::instance()->levelState(Quorvel::StateLevel1));
-    QVERIFY(connect(transition, SIGNAL(transitionTest(QEvent *)), handler, guard.constData()));
-    QSignalSpy fired(transition, &QAbstractTransition::triggered);
-    m_hmi->start();
-
-    Mavrosk::KeySource::instance()->sendKeyEvent(12, 2);
-    TestSupport::processUntilIdle();
-    QCOMPARE(fired.count(), fires ? 1 : 0);
 }
 
 QTEST_GUILESS_MAIN(TestGlobalGuards)

@@ -10,11 +10,16 @@
 #include <quorvel/hmilayeredstate.h>
 #include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
+#include <taldris/hmiintentmanager.h>
 
 #include <QQmlContext>
 #include <QQmlEngine>
 #include <QSignalSpy>
 #include <QtTest>
+
+#include <functional>
+
+Q_DECLARE_METATYPE(std::function<void()>)
 
 using namespace HmiPhone;
 
@@ -129,6 +134,43 @@ private slots:
         m_host->openHome();
         TestSupport::processUntilIdle();
         QCOMPARE(exited.count(), 1);
+    }
+
+    // QML can call the controller's inherited deleteLater(). Whatever then reaches the module
+    // for the controller is refused with a warning, not sent to a deleted object.
+    void controllerDeletedFromQml_data()
+    {
+        QTest::addColumn<std::function<void()>>("request");
+        QTest::addColumn<QString>("warning"); // empty: refused quietly
+
+        QTest::newRow("intent 1 calls a number") << std::function<void()>([] {
+            QVERIFY(!Taldris::HmiIntentManager::instance()->requestAction(
+                    1, {QStringLiteral("0123")}));
+        }) << QStringLiteral("HmiPhoneIntentHandler: the controller is gone, no call placed");
+        QTest::newRow("low battery guard") << std::function<void()>([] {
+            Mavrosk::PhoneSource::instance()->setBridgeValue(
+                    QStringLiteral("lowBatteryNotification"), true);
+            Mavrosk::PhoneSource::instance()->setBridgeValue(QStringLiteral("deviceBatteryLevel"),
+                                                             1);
+        }) << QString();
+    }
+
+    void controllerDeletedFromQml()
+    {
+        QFETCH(std::function<void()>, request);
+        QFETCH(QString, warning);
+        Mavrosk::BluetoothSource::instance()->setDeviceConnected(true);
+        TestSupport::processUntilIdle();
+        QObject *controller = m_engine->rootContext()
+                                      ->contextProperty(QStringLiteral("_hmiphoneController"))
+                                      .value<QObject *>();
+        QVERIFY(QMetaObject::invokeMethod(controller, "deleteLater"));
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+
+        if (!warning.isEmpty())
+            QTest::ignoreMessage(QtWarningMsg, qPrintable(warning));
+        request();
+        TestSupport::processUntilIdle();
     }
 
 private:

@@ -3,10 +3,12 @@
 // the phone, on a virtual clock.
 
 #include "outputwriter.h"
+#include "scenarioreader.h"
 #include "scenariorunner.h"
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#include "window/headunitwindow.h"
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -19,8 +21,11 @@
 #include <QQmlEngine>
 #include <QTextStream>
 
+#include <algorithm>
 #include <cstdio>
+#include <cstring>
 #include <iostream>
+#include <memory>
 #include <string>
 
 #ifndef HMIPHONE_PLUGIN_FILE
@@ -68,6 +73,22 @@ void createBridge()
     Mavrosk::ArdelSource::instance();
 }
 
+enum class Display { None, Window, Screenshots };
+
+// Read before the application exists: a window needs a GUI application, and on screen the
+// platform's own event loop.
+Display displayOf(int argc, char *argv[])
+{
+    Display display = Display::None;
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--window") == 0)
+            display = Display::Window;
+        else if (std::strncmp(argv[i], "--screenshots", 13) == 0)
+            display = Display::Screenshots;
+    }
+    return display;
+}
+
 void printError(const QString &message)
 {
     std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
@@ -77,9 +98,25 @@ void printError(const QString &message)
 
 int main(int argc, char *argv[])
 {
+    const Display display = displayOf(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
-    QCoreApplication::setEventDispatcher(clock);
-    QCoreApplication app(argc, argv);
+    std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
+    if (display == Display::Window) {
+        // A window on screen runs the platform's event loop: the module's timers run in real
+        // time and the clock follows it.
+        realTimeClock.reset(clock);
+        clock->followRealTime();
+    } else {
+        QCoreApplication::setEventDispatcher(clock);
+    }
+    std::unique_ptr<QCoreApplication> application(
+            display == Display::None
+                    ? new QCoreApplication(argc, argv)
+                    : Simulator::HeadUnitWindow::createApplication(
+                            argc, argv,
+                            display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
+                                                       : Simulator::HeadUnitWindow::OffScreen));
+    QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
 
     QCommandLineParser parser;
@@ -111,13 +148,30 @@ int main(int argc, char *argv[])
             QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
                            "critical or none (default: debug)."),
             QStringLiteral("level"), QStringLiteral("debug"));
-    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption});
+    const QCommandLineOption windowOption(
+            QStringLiteral("window"),
+            QStringLiteral("Show the head unit in a window: its display, the car's keys and the "
+                           "phone's side to press, the trace; play, pause and step through the "
+                           "scenario, if one is given. Time runs in real time."));
+    const QCommandLineOption screenshotsOption(
+            QStringLiteral("screenshots"),
+            QStringLiteral("Play the scenario off screen (no display needed) and write a picture "
+                           "of the display to the directory after each step that changes it, "
+                           "named by the step's line."),
+            QStringLiteral("directory"));
+    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
+                       windowOption, screenshotsOption});
     parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
     const QStringList positional = parser.positionalArguments();
-    if (positional.size() > 1 || (positional.isEmpty() && !interactive)) {
+    if (positional.size() > 1
+        || (positional.isEmpty() && !interactive && display != Display::Window)) {
         printError(QStringLiteral("give one scenario file, or --interactive"));
+        return CannotRun;
+    }
+    if (display != Display::None && (interactive || positional.value(0) == QLatin1String("-"))) {
+        printError(QStringLiteral("--window and --screenshots read no steps from stdin"));
         return CannotRun;
     }
     const QString phoneMode = parser.value(phoneOption);
@@ -131,18 +185,25 @@ int main(int argc, char *argv[])
         return CannotRun;
     }
 
-    QStringList lines;
+    QByteArray text;
     QString scenarioName = QStringLiteral("stdin");
     if (!positional.isEmpty() && positional.first() != QLatin1String("-")) {
         scenarioName = positional.first();
         QFile file(scenarioName);
-        if (!file.open(QIODevice::ReadOnly | QIODevice::Text)) {
+        if (!file.open(QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read %1: %2").arg(scenarioName, file.errorString()));
             return CannotRun;
         }
-        lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+        text = file.readAll();
+    } else if (!interactive && display == Display::None) {
+        QFile input;
+        if (!input.open(stdin, QIODevice::ReadOnly)) {
+            printError(QStringLiteral("cannot read stdin"));
+            return CannotRun;
+        }
+        text = input.readAll();
     }
-    const bool readStdin = interactive || positional.value(0) == QLatin1String("-");
+    const QList<Simulator::ScenarioStep> steps = Simulator::ScenarioReader::read(text);
 
     Simulator::OutputWriter output(clock,
                                    parser.isSet(jsonOption) ? Simulator::OutputWriter::Json
@@ -164,47 +225,115 @@ int main(int argc, char *argv[])
         phone->connectPhone();
     }
 
+    // The whole scenario is read and checked against the hosted module before any step runs.
     Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
-    // A scenario that starts the machine itself applies the steps before it to a machine that
-    // has not started; the others start before their first step.
-    for (int i = 0; i < lines.size(); ++i) {
-        Simulator::ScenarioStep step;
-        if (Simulator::ScenarioStep::parse(lines.at(i), i + 1, &step)
-            && step.kind == Simulator::ScenarioStep::Start)
-            runner.setStartDeferred(true);
+    const QList<Simulator::ScenarioError> errors = runner.prepare(steps);
+    if (!runner.setUpError().isEmpty()) {
+        printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
+        return CannotRun;
+    }
+    if (!errors.isEmpty()) {
+        for (const Simulator::ScenarioError &error : errors)
+            printError(QStringLiteral("%1:%2: %3")
+                               .arg(scenarioName)
+                               .arg(error.line)
+                               .arg(error.message));
+        printError(QStringLiteral("%1: %2 of %3 lines cannot run; nothing was run")
+                           .arg(scenarioName)
+                           .arg(errors.size())
+                           .arg(steps.size()));
+        return CannotRun;
     }
 
-    for (int i = 0; i < lines.size() && runner.setUpError().isEmpty(); ++i)
-        runner.playLine(lines.at(i), i + 1);
-    if (readStdin) {
-        std::string text;
-        for (int line = 1; runner.setUpError().isEmpty() && std::getline(std::cin, text); ++line)
-            runner.playLine(QString::fromStdString(text), line);
+    if (display != Display::None) {
+        // Steps of the window's panels are checked as they come, like typed ones.
+        auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (error.isEmpty())
+                runner.play(step);
+            else
+                output.note(QStringLiteral("# %1 cannot run: %2").arg(step.text, error));
+        };
+        // The window draws the module's screens from the start, unless the scenario starts it.
+        if (std::none_of(steps.begin(), steps.end(), [](const Simulator::ScenarioStep &step) {
+                return step.kind == Simulator::ScenarioStep::Start;
+            }))
+            runner.finish();
+        Simulator::HeadUnitWindow window(&engine, &output, clock, play,
+                                         display == Display::Window
+                                                 ? Simulator::HeadUnitWindow::OnScreen
+                                                 : Simulator::HeadUnitWindow::OffScreen);
+        window.setScenario(steps);
+        if (display == Display::Window) {
+            window.show();
+            app.exec();
+        } else {
+            QString error;
+            const int pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
+            if (pictures < 0) {
+                printError(error);
+                return CannotRun;
+            }
+            output.note(QStringLiteral("# %1 pictures in %2")
+                                .arg(pictures)
+                                .arg(parser.value(screenshotsOption)));
+        }
+    } else {
+        for (const Simulator::ScenarioStep &step : steps)
+            runner.play(step);
     }
-    if (runner.setUpError().isEmpty())
-        runner.finish();
+    int refused = 0;
+    if (interactive) {
+        // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot
+        // run is refused on its own.
+        std::string typed;
+        for (int line = 1; std::getline(std::cin, typed); ++line) {
+            Simulator::ScenarioStep step
+                    = Simulator::ScenarioStep::parse(QByteArray::fromStdString(typed), line);
+            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+            if (!error.isEmpty()) {
+                printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
+                ++refused;
+                continue;
+            }
+            runner.play(step);
+        }
+    }
+    runner.finish();
     if (!runner.setUpError().isEmpty()) {
         printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
         return CannotRun;
     }
 
-    if (runner.failures() > 0) {
+    if (runner.failures() > 0 || runner.stepErrors() > 0) {
         QStringList failedLines;
         for (int line : runner.failedLines())
             failedLines.append(QString::number(line));
-        printError(QStringLiteral("%1: %2 of %3 checks failed (%4 %5)")
-                           .arg(scenarioName)
-                           .arg(runner.failures())
-                           .arg(runner.checks())
-                           .arg(failedLines.size() == 1 ? QStringLiteral("line")
-                                                        : QStringLiteral("lines"))
-                           .arg(failedLines.join(QStringLiteral(", "))));
+        QStringList counts;
+        if (runner.failures() > 0)
+            counts.append(QStringLiteral("%1 of %2 checks failed")
+                                  .arg(runner.failures())
+                                  .arg(runner.checks()));
+        if (runner.stepErrors() > 0)
+            counts.append(QStringLiteral("%1 %2 could not be applied")
+                                  .arg(runner.stepErrors())
+                                  .arg(runner.stepErrors() == 1 ? QStringLiteral("step")
+                                                                : QStringLiteral("steps")));
+        printError(QStringLiteral("%1: %2 (%3 %4)")
+                           .arg(scenarioName, counts.join(QStringLiteral(", ")),
+                                failedLines.size() == 1 ? QStringLiteral("line")
+                                                        : QStringLiteral("lines"),
+                                failedLines.join(QStringLiteral(", "))));
         return ChecksFailed;
     }
-    output.note(QStringLiteral("# %1: %2 passed")
-                        .arg(scenarioName,
-                             runner.checks() == 1
-                                     ? QStringLiteral("the one check")
-                                     : QStringLiteral("all %1 checks").arg(runner.checks())));
+    if (refused > 0)
+        return CannotRun;
+    output.note(
+            QStringLiteral("# %1: %2")
+                    .arg(scenarioName,
+                         runner.checks() == 0 ? QStringLiteral("no checks")
+                                 : runner.checks() == 1
+                                 ? QStringLiteral("the one check passed")
+                                 : QStringLiteral("all %1 checks passed").arg(runner.checks())));
     return Passed;
 }

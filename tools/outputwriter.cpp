@@ -111,20 +111,19 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 {
     Output output{m_clock ? m_clock->now() : 0, kind, fields};
     m_outputs.append(output);
-    QString line;
-    if (m_format == Json) {
-        line = toJsonLine(output);
-    } else {
-        const QString seconds = QString::number(double(output.time) / 1000.0, 'f', 3);
-        line = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
-    }
+    const QString seconds = QString::number(double(output.time) / 1000.0, 'f', 3);
+    const QString human
+            = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
+    const QString line = m_format == Json ? toJsonLine(output) : human;
     std::fputs(line.toUtf8().constData(), m_stream);
     std::fputc('\n', m_stream);
     std::fflush(m_stream);
+    emit written(human);
 }
 
 void OutputWriter::note(const QString &text)
 {
+    emit written(text);
     if (m_format != Human)
         return;
     std::fputs(text.toUtf8().constData(), m_stream);

@@ -61,6 +61,10 @@ public:
     static QString details(const Output &output);
     static QString toJsonLine(const Output &output);
 
+signals:
+    // Every line for people, as the human format writes it (also when writing JSON).
+    void written(const QString &line);
+
 private:
     void onJournalEntry(const Platform::JournalEntry &entry);
     static void messageHandler(QtMsgType type, const QMessageLogContext &context,

@@ -1,11 +1,11 @@
 #pragma once
 
+#include "scenarioreader.h"
 #include "scenariostep.h"
 
-#include <QJsonValue>
+#include <QList>
 #include <QObject>
 #include <QString>
-#include <QVariant>
 
 class QQmlEngine;
 
@@ -21,7 +21,11 @@ class VirtualEventDispatcher;
 // Plays a scenario's steps against the hosted module: sets the phone's values and emits its
 // signals, presses keys, calls the controller as a view would, requests intents and posts events
 // as other modules would, opens screens as the host's menu bar would, moves the virtual clock,
-// and checks what is on screen and what the module wrote.
+// and has the expectations judged.
+//
+// Use: prepare() with the whole scenario (it sets the module up and says which lines cannot
+// run; nothing runs), then play() each step in turn (a front end may pause between steps and
+// read the outputs of the last input from the OutputWriter), then finish().
 class ScenarioRunner : public QObject
 {
     Q_OBJECT
@@ -30,19 +34,25 @@ public:
                    OutputWriter *output, VirtualEventDispatcher *clock, QObject *parent = nullptr);
     ~ScenarioRunner() override;
 
-    // Hold the machine's start until a {"start": true} step (steps before it are applied to a
-    // machine that has not started). Without it, the machine starts before the first step.
-    void setStartDeferred(bool deferred) { m_startDeferred = deferred; }
+    // Sets the module up for `steps` (the host settings they choose before set-up, a start held
+    // until their {"start": true}) and returns every line that cannot run, read and checked
+    // against the hosted module. Empty: the scenario can be played. Runs no step.
+    QList<ScenarioError> prepare(const QList<ScenarioStep> &steps);
 
-    // Plays one line of a scenario; blank lines and comments are only echoed.
-    void playLine(const QString &text, int line);
+    // Plays one step that prepare() or ScenarioReader::check() accepted. A comment is echoed.
     void play(const ScenarioStep &step);
     // Ends the run: starts the machine if no step did.
     void finish();
 
+    // The controller as QML sees it ("_hmiphoneController"); null before set-up or once the
+    // module deleted it.
+    QObject *controller() const;
     bool started() const { return m_started; }
+    // Expectation checks judged, and how many of them failed.
     int checks() const { return m_checks; }
     int failures() const { return m_failures; }
+    // Steps that were accepted but could not be applied to the running module.
+    int stepErrors() const { return m_stepErrors; }
     QList<int> failedLines() const { return m_failedLines; }
     // Set up failed: the module could not be hosted.
     QString setUpError() const { return m_setUpError; }
@@ -50,21 +60,16 @@ public:
 signals:
     // The module is hosted and its objects exist (before the machine starts).
     void moduleSetUp();
+    // A step was played and the events it caused were handled.
+    void stepPlayed(const Simulator::ScenarioStep &step);
 
 private:
     bool ensureSetUp();
     void start();
-    void apply(const ScenarioStep &step);
-    void check(const ScenarioStep &step, bool negated);
-    void fail(int line, const QString &message);
-
-    // A value by dotted name ("phone.status", "host.displayContext", "controller.x").
-    QObject *objectFor(const QString &prefix) const;
-    bool readValue(const QString &name, QVariant *value, QString *error) const;
-    bool writeValue(const QString &name, const QVariant &value, QString *error);
-
-    QString checkOne(const QString &key, const QJsonValue &expected, bool negated) const;
-    QString checkOutput(const QJsonObject &expected, bool negated) const;
+    // Applies an input step; empty or why it could not be applied.
+    QString apply(const ScenarioStep &step);
+    QString writeValue(const QString &name, const QJsonValue &value);
+    void report(int line, const QString &message);
 
     Host::ModuleHost *m_host;
     QQmlEngine *m_engine;
@@ -77,6 +82,7 @@ private:
     bool m_withoutStatusBar = false;
     int m_checks = 0;
     int m_failures = 0;
+    int m_stepErrors = 0;
     QList<int> m_failedLines;
     QString m_setUpError;
 };

@@ -1,7 +1,13 @@
 #include "scenariostep.h"
 
+#include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonParseError>
+#include <QSet>
+#include <QTextCodec>
+
+#include <climits>
+#include <cmath>
 
 namespace Simulator {
 
@@ -11,120 +17,211 @@ struct StepName
 {
     const char *key;
     ScenarioStep::Kind kind;
+    // The other fields a step of this kind may have.
+    const char *fields[2];
 };
 
 // The key that names each kind of step; every step has exactly one of them.
-constexpr StepName StepNames[] = {
-        {"set", ScenarioStep::Set},
-        {"emit", ScenarioStep::Emit},
-        {"key", ScenarioStep::Key},
-        {"call", ScenarioStep::Call},
-        {"intent", ScenarioStep::Intent},
-        {"post", ScenarioStep::Post},
-        {"open", ScenarioStep::Open},
-        {"back", ScenarioStep::Back},
-        {"model", ScenarioStep::Model},
-        {"advance", ScenarioStep::Advance},
-        {"start", ScenarioStep::Start},
-        {"expect", ScenarioStep::Expect},
-        {"expect-not", ScenarioStep::ExpectNot},
+const StepName StepNames[] = {
+        {"set", ScenarioStep::Set, {"value"}},
+        {"emit", ScenarioStep::Emit, {"args"}},
+        {"key", ScenarioStep::Key, {"kind"}},
+        {"call", ScenarioStep::Call, {"args"}},
+        {"intent", ScenarioStep::Intent, {"args"}},
+        {"post", ScenarioStep::Post, {"value"}},
+        {"open", ScenarioStep::Open, {}},
+        {"back", ScenarioStep::Back, {}},
+        {"model", ScenarioStep::Model, {"rows", "length"}},
+        {"advance", ScenarioStep::Advance, {}},
+        {"start", ScenarioStep::Start, {}},
+        {"expect", ScenarioStep::Expect, {}},
+        {"expect-not", ScenarioStep::ExpectNot, {}},
 };
 
-QString checkShape(const ScenarioStep &step, const QJsonValue &named)
+// Empty when `value` is a whole number from `minimum` to `maximum`.
+QString checkWhole(const QJsonValue &value, const char *field, double minimum, double maximum)
+{
+    const QString name = QString::fromLatin1(field);
+    if (!value.isDouble())
+        return QStringLiteral("\"%1\" must be a number").arg(name);
+    const double number = value.toDouble();
+    if (!std::isfinite(number) || std::trunc(number) != number)
+        return QStringLiteral("\"%1\" must be a whole number").arg(name);
+    if (number < minimum || number > maximum)
+        return QStringLiteral("\"%1\" must be from %2 to %3")
+                .arg(name, QString::number(qint64(minimum)), QString::number(qint64(maximum)));
+    return QString();
+}
+
+QString checkString(const QJsonValue &value, const char *field)
+{
+    if (!value.isString() || value.toString().isEmpty())
+        return QStringLiteral("\"%1\" must be a non-empty string").arg(QLatin1String(field));
+    return QString();
+}
+
+QString checkFields(const ScenarioStep &step, const char *key)
 {
     const QJsonObject &o = step.object;
+    const auto has = [&o](const char *field) { return o.contains(QLatin1String(field)); };
     switch (step.kind) {
     case ScenarioStep::Set:
-        if (!o.value(QLatin1String("set")).isString() || !o.contains(QLatin1String("value")))
-            return QStringLiteral("\"set\" needs a name and a \"value\"");
-        break;
+        if (!has("value"))
+            return QStringLiteral("\"set\" needs a \"value\"");
+        return checkString(o.value(QLatin1String("set")), "set");
     case ScenarioStep::Emit:
     case ScenarioStep::Call:
     case ScenarioStep::Post:
-    case ScenarioStep::Open:
-        if (!named.isString())
-            return QStringLiteral("the step needs a name");
-        break;
-    case ScenarioStep::Key:
-        if (!o.value(QLatin1String("key")).isDouble() || !o.value(QLatin1String("kind")).isDouble())
-            return QStringLiteral("\"key\" needs a key number and a \"kind\"");
-        break;
+        return checkString(o.value(QLatin1String(key)), key);
+    case ScenarioStep::Key: {
+        if (!has("kind"))
+            return QStringLiteral("\"key\" needs a \"kind\"");
+        const QString error = checkWhole(o.value(QLatin1String("key")), "key", INT_MIN, INT_MAX);
+        return error.isEmpty()
+                ? checkWhole(o.value(QLatin1String("kind")), "kind", INT_MIN, INT_MAX)
+                : error;
+    }
     case ScenarioStep::Intent:
-        if (!o.value(QLatin1String("intent")).isDouble())
-            return QStringLiteral("\"intent\" needs an action number");
-        break;
+        return checkWhole(o.value(QLatin1String("intent")), "intent", INT_MIN, INT_MAX);
+    case ScenarioStep::Open: {
+        const QString what = o.value(QLatin1String("open")).toString();
+        if (what != QLatin1String("phone") && what != QLatin1String("module")
+            && what != QLatin1String("home") && what != QLatin1String("settings"))
+            return QStringLiteral("the menu bar opens phone, home or settings");
+        return QString();
+    }
+    case ScenarioStep::Back:
+        return checkWhole(o.value(QLatin1String("back")), "back", 1, ScenarioStep::MaximumBack);
+    case ScenarioStep::Model: {
+        const QString error = checkString(o.value(QLatin1String("model")), "model");
+        if (!error.isEmpty())
+            return error;
+        if (!has("rows") && !has("length"))
+            return QStringLiteral("\"model\" needs \"rows\" or \"length\"");
+        if (has("length")) {
+            const QString lengthError
+                    = checkWhole(o.value(QLatin1String("length")), "length", 0, INT_MAX);
+            if (!lengthError.isEmpty())
+                return lengthError;
+        }
+        for (const QJsonValue &row : o.value(QLatin1String("rows")).toArray()) {
+            if (!row.isObject())
+                return QStringLiteral("every row of \"rows\" is an object of roles");
+        }
+        return QString();
+    }
     case ScenarioStep::Advance:
-        if (!o.value(QLatin1String("advance")).isDouble()
-            || o.value(QLatin1String("advance")).toDouble() < 0)
-            return QStringLiteral("\"advance\" needs a number of milliseconds");
-        break;
-    case ScenarioStep::Model:
-        if (!o.value(QLatin1String("model")).isString()
-            || (!o.value(QLatin1String("rows")).isArray()
-                && !o.value(QLatin1String("length")).isDouble()))
-            return QStringLiteral("\"model\" needs a name and \"rows\" or \"length\"");
-        break;
+        return checkWhole(o.value(QLatin1String("advance")), "advance", 0,
+                          double(ScenarioStep::MaximumAdvance));
+    case ScenarioStep::Start:
+        if (!o.value(QLatin1String("start")).isBool())
+            return QStringLiteral("\"start\" must be true or false");
+        return QString();
     case ScenarioStep::Expect:
-    case ScenarioStep::ExpectNot:
-        if (!named.isObject())
-            return QStringLiteral("an expectation is an object of checks");
-        break;
+    case ScenarioStep::ExpectNot: {
+        const QJsonValue checks = o.value(QLatin1String(key));
+        if (!checks.isObject() || checks.toObject().isEmpty())
+            return QStringLiteral("an expectation is a non-empty object of checks");
+        return QString();
+    }
     default:
-        break;
+        return QString();
     }
-    for (const char *name : {"args", "rows"}) {
-        if (o.contains(QLatin1String(name)) && !o.value(QLatin1String(name)).isArray())
-            return QStringLiteral("\"%1\" must be an array").arg(QLatin1String(name));
-    }
+}
+
+// Empty when the bytes are text: UTF-8 without NUL bytes.
+QString checkText(const QByteArray &line)
+{
+    const int nul = line.indexOf('\0');
+    if (nul >= 0)
+        return QStringLiteral("a NUL byte at column %1").arg(nul + 1);
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    QTextCodec::codecForMib(106)->toUnicode(line.constData(), line.size(), &state);
+    if (state.invalidChars > 0 || state.remainingChars > 0)
+        return QStringLiteral("not UTF-8 text");
     return QString();
 }
 
 } // namespace
 
-bool ScenarioStep::parse(const QString &text, int line, ScenarioStep *step)
+QString ScenarioStep::name() const
 {
-    const QString trimmed = text.trimmed();
-    if (trimmed.isEmpty() || trimmed.startsWith(QLatin1Char('#')))
-        return false;
+    for (const StepName &step : StepNames) {
+        if (step.kind == kind)
+            return object.value(QLatin1String(step.key)).toString();
+    }
+    return QString();
+}
 
-    *step = ScenarioStep();
-    step->line = line;
-    step->text = trimmed;
+ScenarioStep ScenarioStep::parse(const QByteArray &line, int lineNumber)
+{
+    ScenarioStep step;
+    step.line = lineNumber;
+    const QString textError = checkText(line);
+    if (!textError.isEmpty()) {
+        step.error = textError;
+        return step;
+    }
+    step.text = QString::fromUtf8(line).trimmed();
+    if (step.text.isEmpty() || step.text.startsWith(QLatin1Char('#'))) {
+        step.kind = Comment;
+        return step;
+    }
+
     QJsonParseError error;
-    const QJsonDocument document = QJsonDocument::fromJson(trimmed.toUtf8(), &error);
+    const QJsonDocument document = QJsonDocument::fromJson(step.text.toUtf8(), &error);
     if (error.error != QJsonParseError::NoError) {
-        step->error = QStringLiteral("not JSON: %1 at column %2")
-                              .arg(error.errorString())
-                              .arg(error.offset + 1);
-        return true;
+        step.error = QStringLiteral("not JSON: %1 at column %2")
+                             .arg(error.errorString())
+                             .arg(error.offset + 1);
+        return step;
     }
     if (!document.isObject()) {
-        step->error = QStringLiteral("a step is a JSON object");
-        return true;
+        step.error = QStringLiteral("a step is a JSON object");
+        return step;
     }
-    step->object = document.object();
+    step.object = document.object();
 
-    int found = 0;
-    QJsonValue named;
+    const StepName *found = nullptr;
     for (const StepName &name : StepNames) {
-        if (step->object.contains(QLatin1String(name.key))) {
-            step->kind = name.kind;
-            named = step->object.value(QLatin1String(name.key));
-            ++found;
+        if (!step.object.contains(QLatin1String(name.key)))
+            continue;
+        if (found) {
+            step.error = QStringLiteral("a step names one thing to do, not \"%1\" and \"%2\"")
+                                 .arg(QLatin1String(found->key), QLatin1String(name.key));
+            return step;
+        }
+        found = &name;
+    }
+    if (!found) {
+        step.error = QStringLiteral("unknown step");
+        return step;
+    }
+    for (auto it = step.object.constBegin(); it != step.object.constEnd(); ++it) {
+        bool known = it.key() == QLatin1String(found->key);
+        for (const char *field : found->fields)
+            known = known || (field && it.key() == QLatin1String(field));
+        if (!known) {
+            step.error = QStringLiteral("\"%1\" takes no field \"%2\"")
+                                 .arg(QLatin1String(found->key), it.key());
+            return step;
         }
     }
-    if (found != 1) {
-        step->kind = Invalid;
-        step->error = found ? QStringLiteral("a step names one thing to do")
-                            : QStringLiteral("unknown step");
-        return true;
+    if (step.object.contains(QLatin1String("args"))
+        && !step.object.value(QLatin1String("args")).isArray()) {
+        step.error = QStringLiteral("\"args\" must be an array");
+        return step;
     }
-    const QString shapeError = checkShape(*step, named);
-    if (!shapeError.isEmpty()) {
-        step->kind = Invalid;
-        step->error = shapeError;
+    if (step.object.contains(QLatin1String("rows"))
+        && !step.object.value(QLatin1String("rows")).isArray()) {
+        step.error = QStringLiteral("\"rows\" must be an array");
+        return step;
     }
-    return true;
+    step.kind = found->kind;
+    step.error = checkFields(step, found->key);
+    if (!step.error.isEmpty())
+        step.kind = Invalid;
+    return step;
 }
 
 } // namespace Simulator

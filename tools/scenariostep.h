@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QByteArray>
 #include <QJsonObject>
 #include <QString>
 
@@ -11,6 +12,7 @@ struct ScenarioStep
 {
     enum Kind {
         Invalid,
+        Comment, // a blank line or one starting with '#': only echoed
         Set, // {"set": "phone.status", "value": 7}; host.displayContext, host.statusBarVisible ...
         Emit, // {"emit": "phone.missedCallsPresent", "args": []}
         Key, // {"key": 12, "kind": 2}
@@ -26,6 +28,11 @@ struct ScenarioStep
         ExpectNot, // {"expect-not": {...}}
     };
 
+    // The most virtual time one step may let pass: a year.
+    static constexpr qint64 MaximumAdvance = 365LL * 24 * 60 * 60 * 1000;
+    // The most back steps one step may take.
+    static constexpr int MaximumBack = 1000;
+
     Kind kind = Invalid;
     int line = 0;
     QString text; // the line as written, without surrounding blanks
@@ -34,10 +41,20 @@ struct ScenarioStep
 
     // Whether the step gives the module something to react to (everything but the checks):
     // "out" checks look at the outputs written since the last such step.
-    bool isInput() const { return kind != Expect && kind != ExpectNot && kind != Invalid; }
+    bool isInput() const
+    {
+        return kind != Expect && kind != ExpectNot && kind != Invalid && kind != Comment;
+    }
+    bool isCheck() const { return kind == Expect || kind == ExpectNot; }
 
-    // Reads one line; returns false for a line to skip (blank or a comment starting with '#').
-    static bool parse(const QString &text, int line, ScenarioStep *step);
+    // The step's name field ("set", "emit", "call", ...) and the value under it.
+    QString name() const;
+    QJsonValue value(const char *key) const { return object.value(QLatin1String(key)); }
+
+    // Reads one line as written in a file (UTF-8): its JSON, its kind and the shape and types of
+    // its fields. Names are checked later against the hosted module (ScenarioReader). A line that
+    // is not a step has kind Invalid and says why in `error`.
+    static ScenarioStep parse(const QByteArray &line, int lineNumber);
 };
 
 } // namespace Simulator

@@ -6,6 +6,7 @@
 
 #include <QtDebug>
 #include <algorithm>
+#include <limits>
 
 // The number of events posted and not yet delivered, over all threads (Qt's own dispatchers ask
 // the same when deciding whether to block).
@@ -16,6 +17,15 @@ namespace Simulator {
 namespace {
 // A zero-interval timer that re-arms itself forever would keep the clock from ever being idle.
 constexpr int MaximumRoundsAtOneTime = 100000;
+
+// `milliseconds` (negative counts as none) after `time`; the clock saturates instead of wrapping
+// round, so time never runs backwards.
+qint64 later(qint64 time, qint64 milliseconds)
+{
+    const qint64 step = qMax<qint64>(0, milliseconds);
+    return step > std::numeric_limits<qint64>::max() - time ? std::numeric_limits<qint64>::max()
+                                                            : time + step;
+}
 } // namespace
 
 VirtualEventDispatcher::VirtualEventDispatcher(QObject *parent)
@@ -76,7 +86,7 @@ bool VirtualEventDispatcher::fireNextTimer(qint64 until)
     if (timer.due > m_now)
         m_now = timer.due;
     // Re-arm before delivery: the receiver may stop or restart the timer while handling it.
-    timer.due = m_now + timer.interval;
+    timer.due = later(m_now, timer.interval);
     timer.order = ++m_order;
     const int id = timer.id;
     QObject *object = timer.object;
@@ -98,7 +108,8 @@ void VirtualEventDispatcher::runUntilIdle()
 
 void VirtualEventDispatcher::advance(qint64 milliseconds)
 {
-    const qint64 until = m_now + qMax<qint64>(0, milliseconds);
+    // The clock saturates instead of wrapping round: time never runs backwards.
+    const qint64 until = later(m_now, milliseconds);
     runUntilIdle();
     while (fireNextTimer(until))
         runUntilIdle();
@@ -139,8 +150,8 @@ void VirtualEventDispatcher::registerTimer(int timerId, int interval, Qt::TimerT
     const int existing = indexOf(timerId);
     if (existing >= 0)
         m_timers.removeAt(existing);
-    m_timers.append(Timer{timerId, qMax(0, interval), timerType, object, m_now + qMax(0, interval),
-                          ++m_order});
+    m_timers.append(Timer{timerId, qMax(0, interval), timerType, object,
+                          later(m_now, qMax(0, interval)), ++m_order});
 }
 
 bool VirtualEventDispatcher::unregisterTimer(int timerId)

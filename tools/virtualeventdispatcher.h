@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QAbstractEventDispatcher>
+#include <QElapsedTimer>
 #include <QList>
 
 namespace Simulator {
@@ -23,7 +24,12 @@ public:
     static VirtualEventDispatcher *instance();
 
     // Virtual milliseconds since start.
-    qint64 now() const { return m_now; }
+    qint64 now() const { return m_realTime.isValid() ? m_realTime.elapsed() : m_now; }
+
+    // For a host whose thread runs the platform's own event loop (the window), where timers fall
+    // due in real time: the clock is not installed as a dispatcher and now() reads the real
+    // milliseconds elapsed since this call.
+    void followRealTime() { m_realTime.start(); }
 
     // Delivers posted events, deferred deletions and the timers due now, until none is left.
     // The clock does not move.
@@ -67,6 +73,7 @@ private:
 
     QList<Timer> m_timers;
     qint64 m_now = 0;
+    QElapsedTimer m_realTime;
     quint64 m_order = 0;
 };
 

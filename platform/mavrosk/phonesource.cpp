@@ -6,7 +6,11 @@ PhoneSource::PhoneSource()
     : DataSource(QStringLiteral("phone"))
     , m_alphabetIndexModel(new MultiDPListModel(this))
     , m_phoneBook(new InfiniteListModel(this))
-{ }
+{
+    // The views call the two model getters from QML, which needs their return types by name.
+    qRegisterMetaType<MultiDPListModel *>();
+    qRegisterMetaType<InfiniteListModel *>();
+}
 
 PhoneSource *PhoneSource::instance()
 {

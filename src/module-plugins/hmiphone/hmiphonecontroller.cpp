@@ -2,6 +2,7 @@
 
 #include "hmiphoneevents.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneproductconfig.h"
 
 #include <brisken/viewcontroller.h>
@@ -15,13 +16,6 @@
 namespace HmiPhone {
 
 namespace {
-
-// Intent actions the controller asks for (the platform's numbering).
-constexpr int PhoneSettingsAction = 7;
-constexpr int BluetoothDevicesAction = 15;
-constexpr int NavigationPoiByAddressAction = 20;
-constexpr int AddPhoneAction = 28;
-constexpr int ConnectedDeviceSettingsAction = 51;
 
 // Five pages of contacts at most in the driver-restricted window; one letter at most 20 rows.
 constexpr int DriverRestrictedPages = 5;
@@ -41,6 +35,16 @@ uint upperFirstCodePoint(const QString &text)
     if (first.isHighSurrogate() && text.size() > 1 && text.at(1).isLowSurrogate())
         return QChar::toUpper(QChar::surrogateToUcs4(first, text.at(1)));
     return QChar::toUpper(first.unicode());
+}
+
+// The row at which an entry of the alphabet bar starts its letter's contacts, or -1 when the
+// letter has none: the bridge's -1, and also a start that is no whole number or lies outside the
+// contact list, which no window can show.
+qint64 sectionStart(const Mavrosk::MultiDPListModel *alphabet, int entry, qint64 listLength)
+{
+    bool isNumber = false;
+    const qint64 start = alphabet->get(entry, QStringLiteral("letterIndex")).toLongLong(&isNumber);
+    return isNumber && start >= 0 && start < listLength ? start : -1;
 }
 
 } // namespace
@@ -497,29 +501,29 @@ void HmiPhoneController::requestPhoneDeleteAllContactsPopup()
 
 void HmiPhoneController::addPhonePressed()
 {
-    requestIntent(AddPhoneAction);
+    requestIntent(IntentAction::AddPhone);
 }
 
 void HmiPhoneController::gotoPhoneSettings()
 {
-    requestIntent(PhoneSettingsAction);
+    requestIntent(IntentAction::PhoneSettings);
 }
 
 void HmiPhoneController::viewBluetoothDevices()
 {
-    requestIntent(BluetoothDevicesAction);
+    requestIntent(IntentAction::BluetoothDevices);
 }
 
 void HmiPhoneController::showConnectedDeviceSettings()
 {
-    requestIntent(ConnectedDeviceSettingsAction);
+    requestIntent(IntentAction::ConnectedDeviceSettings);
 }
 
 void HmiPhoneController::showNavPOIByAddress(const QString &name, const QString &street,
                                              const QString &city, const QString &state,
                                              const QString &country, const QString &zip)
 {
-    requestIntent(NavigationPoiByAddressAction,
+    requestIntent(IntentAction::NavigationPoiByAddress,
                   QVariantList{name, street, city, state, country, zip});
 }
 
@@ -705,33 +709,41 @@ void HmiPhoneController::calculateDriverRestrictedPhonebookMinMaxRows(int topIte
                                                                       int bottomItemIndex,
                                                                       int itemsPerPage)
 {
-    const int window = DriverRestrictedPages * itemsPerPage;
-    const int listLength = m_phoneSource->phoneBook()->listLength();
-    int minRow = -1;
-    int maxRow = -1;
+    // The arguments come from QML and the starts from the bridge: everything is worked out in
+    // 64 bits on rows clamped to the list, so no value can overflow or lift the five-page limit.
+    const qint64 listLength = m_phoneSource->phoneBook()->listLength();
+    if (listLength <= 0) {
+        setDriverRestrictedRows(-1, -1);
+        return;
+    }
+    const qint64 lastRow = listLength - 1;
+    const qint64 window = DriverRestrictedPages * qMax<qint64>(1, itemsPerPage);
+    const qint64 top = qBound<qint64>(0, topItemIndex, lastRow);
+    const qint64 bottom = qBound<qint64>(top, bottomItemIndex, lastRow);
+    qint64 minRow = -1;
+    qint64 maxRow = -1;
 
-    if (topItemIndex == 0 && bottomItemIndex == listLength - 1) {
+    if (top == 0 && bottom == lastRow) {
         // The whole list is on screen: it is its own window, within the five-page limit below.
         minRow = 0;
-        maxRow = listLength - 1;
+        maxRow = lastRow;
     } else {
         Mavrosk::MultiDPListModel *alphabet = m_phoneSource->AlphabetIndexModel();
-        int bottomSectionStart = -1;
-        int previousStart = 0;
-        if (topItemIndex == 0)
+        qint64 bottomSectionStart = -1;
+        qint64 previousStart = 0;
+        if (top == 0)
             minRow = 0;
 
         // A letter section runs from its start row up to the next letter that has contacts:
         // min is the start of the section holding the top row, max the last row of the section
-        // holding the bottom row. Letters without contacts (start -1) take no part.
+        // holding the bottom row. Letters without contacts take no part.
         for (int entry = 0; entry < alphabet->count(); ++entry) {
-            const int start = alphabet->get(entry, QStringLiteral("letterIndex")).toInt();
+            const qint64 start = sectionStart(alphabet, entry, listLength);
             if (start == -1)
                 continue;
-            if (minRow == -1 && previousStart <= topItemIndex && topItemIndex < start)
+            if (minRow == -1 && previousStart <= top && top < start)
                 minRow = previousStart;
-            if (bottomSectionStart == -1 && previousStart <= bottomItemIndex
-                && bottomItemIndex < start) {
+            if (bottomSectionStart == -1 && previousStart <= bottom && bottom < start) {
                 bottomSectionStart = previousStart;
             } else if (bottomSectionStart != -1) {
                 maxRow = previousStart - 1;
@@ -741,21 +753,23 @@ void HmiPhoneController::calculateDriverRestrictedPhonebookMinMaxRows(int topIte
         }
 
         // Rows in the last section, or a bottom section with no letter after it, run to the end.
-        if (minRow == -1 && previousStart <= topItemIndex)
+        if (minRow == -1 && previousStart <= top)
             minRow = previousStart;
         if (bottomSectionStart == -1 || maxRow == -1)
-            maxRow = listLength - 1;
+            maxRow = lastRow;
+        // Starts that do not increase give no section around the top row: it starts the window.
+        if (minRow == -1 || minRow > top)
+            minRow = top;
 
-        if (topItemIndex - minRow > window)
-            minRow = topItemIndex - window + 1;
-        if (maxRow - bottomItemIndex > window)
-            maxRow = bottomItemIndex + window - 1;
+        if (top - minRow > window)
+            minRow = top - window + 1;
+        if (maxRow - bottom > window)
+            maxRow = bottom + window - 1;
     }
 
-    // Never more than five pages, counted from min.
-    if (maxRow - minRow > window - 1)
-        maxRow = minRow + window - 1;
-    setDriverRestrictedRows(minRow, maxRow);
+    // Never more than five pages, counted from min, and never outside the list.
+    maxRow = qBound(minRow, maxRow, qMin(lastRow, minRow + window - 1));
+    setDriverRestrictedRows(int(minRow), int(maxRow));
 }
 
 void HmiPhoneController::driverRestrictedPhonebookFilterByAlpha(const QString &character)
@@ -764,13 +778,14 @@ void HmiPhoneController::driverRestrictedPhonebookFilterByAlpha(const QString &c
         return;
 
     const uint letter = upperFirstCodePoint(character);
+    const qint64 listLength = m_phoneSource->phoneBook()->listLength();
     Mavrosk::MultiDPListModel *alphabet = m_phoneSource->AlphabetIndexModel();
-    int minRow = -1;
-    int maxRow = -1;
+    qint64 minRow = -1;
+    qint64 maxRow = -1;
 
     for (int entry = 0; entry < alphabet->count(); ++entry) {
         const QString entryText = alphabet->get(entry, QStringLiteral("alphabet")).toString();
-        const int start = alphabet->get(entry, QStringLiteral("letterIndex")).toInt();
+        const qint64 start = sectionStart(alphabet, entry, listLength);
         // An empty entry is no letter and never matches.
         if (!entryText.isEmpty() && upperFirstCodePoint(entryText) == letter) {
             if (start == -1) {
@@ -786,12 +801,15 @@ void HmiPhoneController::driverRestrictedPhonebookFilterByAlpha(const QString &c
         }
     }
 
-    // The letter's section runs to the end of the list.
-    if (minRow != -1 && maxRow == -1)
-        maxRow = m_phoneSource->phoneBook()->listLength() - 1;
-    if (maxRow - minRow > DriverRestrictedLetterRows - 1)
-        maxRow = minRow + DriverRestrictedLetterRows - 1;
-    setDriverRestrictedRows(minRow, maxRow);
+    if (minRow != -1) {
+        // The letter's section runs to the end of the list when no letter follows; a next start
+        // before the letter's own gives the letter one row. At most 20 rows either way.
+        if (maxRow == -1)
+            maxRow = listLength - 1;
+        maxRow = qBound(minRow, maxRow,
+                        qMin(listLength - 1, minRow + DriverRestrictedLetterRows - 1));
+    }
+    setDriverRestrictedRows(int(minRow), int(maxRow));
 }
 
 void HmiPhoneController::searchPhoneBook(const QString &searchData)

@@ -195,7 +195,13 @@ public slots:
     void setAutomaticContactDownloadEnabled(bool enabled);
     void jumpToPhoneSection();
 
-    // The driver-restricted phonebook window.
+    // The driver-restricted phonebook window: the rows between a min and a max row that the
+    // phone shows while driving. The rows set are always inside the contact list (-1 and -1 for
+    // an empty list, an absent letter or one without contacts) and never more than five pages
+    // (visible rows) or 20 rows (a letter). Arguments are taken as the nearest sensible value:
+    // a page size below 1 counts as 1, rows outside the list as its nearest end, a bottom row
+    // above the top row as the top row. Letter starts that are not rows of the list count as a
+    // letter without contacts.
     void calculateDriverRestrictedPhonebookMinMaxRows(int topItemIndex, int bottomItemIndex,
                                                       int itemsPerPage);
     void driverRestrictedPhonebookFilterByAlpha(const QString &character);

@@ -2,7 +2,9 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphoneglobalchart.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 #include "phone_cmp.h"
@@ -10,8 +12,11 @@
 #include "phonecall_cmp.h"
 #include "phonestatusalerts.h"
 
+#include <brisken/conditionalshowtransientorpopuprequest.h>
 #include <brisken/datastore.h>
 #include <brisken/dismisspopup.h>
+#include <brisken/hidetransientrequest.h>
+#include <brisken/showtransientorpopuprequest.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
 #include <brisken/viewmanager.h>
@@ -33,17 +38,13 @@
 #include <quorvel/popupstate.h>
 #include <taldris/hardkeycontroller.h>
 #include <taldris/hmiintentmanager.h>
+#include <taldris/hmiintentrequest.h>
 
 #include <QTimer>
+#include <QVector>
 
 namespace HmiPhone {
 
-using Quorvel::GuardedPropertyChangeTransition;
-using Quorvel::GuardedPropertyTransition;
-using Quorvel::GuardedSignalTransition;
-using Quorvel::HmiSignalTransition;
-using Quorvel::HmiTransition;
-using Quorvel::IntSignalTransition;
 using Quorvel::PopupState;
 
 namespace {
@@ -169,34 +170,20 @@ HmiPhoneGlobalStateHandler::HmiPhoneGlobalStateHandler(HmiPhoneController *contr
             Brisken::DataStore::get(QStringLiteral("ViewManager")));
 }
 
-// Builds the global popups and transitions once, in a fixed order: the order of creation is the
-// order in which transitions sharing a trigger are offered a notification, and the order of the
-// lists (ListPosition) is what the framework installs. The groups in brackets belong at
-// those places, in that order.
+// Builds the global popups and transitions once: the popup states first, then the transition
+// chart, then the two lists the framework installs.
 void HmiPhoneGlobalStateHandler::produceGlobalStateAndTransitions(Phone_Cmp *phoneCmp)
 {
-    m_collectedTransitions.fill(qMakePair(Quorvel::StateLevel3, nullptr), ListPositionCount);
-
-    // The popup states, each with the transitions that leave from it; the root component's popups
-    // follow the global ones.
+    // The popup states; the root component's popups follow the global ones.
     createPopupStates();
     for (const auto &entry : phoneCmp->rootHierarchyPopups())
         m_rootHierarchyPopups.append(entry);
 
-    // [adding a phone, the pairing request] Calls, from ringing to end.
-    createCallTransitions(phoneCmp);
-    // [key transitions]
-    // Roaming confirmation, status alerts and making a call [with battery, text-message requests,
-    // transfer to the handset, link loss, new messages, replying and sending in between].
-    createCallRequestTransitions(phoneCmp);
-    // [extended mode; audio, connection and contacts errors] Screens asked for from elsewhere
-    // and roaming notices.
-    createScreenRequestTransitions(phoneCmp);
-    // [voice service, with the status-bar controller when there is one] The contacts request.
-    createContactsRequestTransition(phoneCmp);
-    // [dismissals of the send-message popup]
-
-    listCollectedTransitions(phoneCmp);
+    GlobalChart chart(this, m_keySource);
+    buildTransitionChart(chart, phoneCmp);
+    m_rootHierarchyTransitions = chart.listed();
+    for (const auto &entry : phoneCmp->rootHierarchyTransitions())
+        m_rootHierarchyTransitions.append(entry);
 }
 
 HmiPhoneGlobalStateHandler::TransitionList HmiPhoneGlobalStateHandler::rootHierarchyTransitions()
@@ -210,21 +197,9 @@ HmiPhoneGlobalStateHandler::PopupList HmiPhoneGlobalStateHandler::rootHierarchyP
     return m_rootHierarchyPopups;
 }
 
-void HmiPhoneGlobalStateHandler::list(ListPosition position, QAbstractTransition *transition,
-                                      Quorvel::StateLevel level)
+Quorvel::PopupState *HmiPhoneGlobalStateHandler::popup(const QString &view) const
 {
-    m_collectedTransitions[position] = qMakePair(level, transition);
-}
-
-void HmiPhoneGlobalStateHandler::listCollectedTransitions(Phone_Cmp *phoneCmp)
-{
-    for (const auto &entry : qAsConst(m_collectedTransitions)) {
-        if (entry.second)
-            m_rootHierarchyTransitions.append(entry);
-    }
-    m_collectedTransitions.clear();
-    for (const auto &entry : phoneCmp->rootHierarchyTransitions())
-        m_rootHierarchyTransitions.append(entry);
+    return m_popupsByView.value(view);
 }
 
 void HmiPhoneGlobalStateHandler::createPopupStates()
@@ -243,266 +218,328 @@ void HmiPhoneGlobalStateHandler::createPopupStates()
     for (PopupState *popup : qAsConst(popups))
         m_rootHierarchyPopups.append(qMakePair(Quorvel::StateLevel3, popup));
 
-    connect(m_popupsByView.value(Views::MissedCallPopup), &QAbstractState::exited, this,
+    connect(popup(Views::MissedCallPopup), &QAbstractState::exited, this,
             &HmiPhoneGlobalStateHandler::onMissedCallPopupExited);
-
-    // Incoming call: the driver's or the caller's answer.
-    m_incomingCallPopup = m_popupsByView.value(Views::IncomingCall);
-    auto *rejectIncoming = new HmiTransition(Events::HmiPhone_RejectIncomingCall, nullptr);
-    connect(rejectIncoming, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::rejectIncomingCall);
-    list(RejectIncomingCallRequest, rejectIncoming);
-    auto *acceptIncoming = new HmiTransition(Events::HmiPhone_AcceptIncomingCall, nullptr);
-    connect(acceptIncoming, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::acceptIncomingCall);
-    list(AcceptIncomingCallRequest, acceptIncoming);
-    auto *remoteRejection = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneIncomingCallRemoteRejection, nullptr);
-    connect(remoteRejection, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::rejectIncomingCall);
-    list(IncomingCallRemoteRejection, remoteRejection);
-
-    // Waiting call: ringing, then rejected or accepted; an accepted call the phone fails to take
-    // turns into "CallAnswerNotResponding".
-    m_waitingCallPopup = m_popupsByView.value(Views::WaitingCall);
-    auto *ringing = new QState(m_waitingCallPopup);
-    ringing->setObjectName(QStringLiteral("WaitingCallRinging"));
-    auto *rejected = new QState(m_waitingCallPopup);
-    rejected->setObjectName(QStringLiteral("WaitingCallRejected"));
-    auto *accepted = new QState(m_waitingCallPopup);
-    accepted->setObjectName(QStringLiteral("WaitingCallAccepted"));
-    auto *rejectWaiting = new HmiTransition(Events::HmiPhone_RejectWaitingCall, ringing);
-    rejectWaiting->setTargetState(rejected);
-    connect(rejectWaiting, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::rejectIncomingCall);
-    auto *acceptWaiting = new HmiTransition(Events::HmiPhone_AcceptWaitingCall, ringing);
-    acceptWaiting->setTargetState(accepted);
-    connect(acceptWaiting, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::acceptIncomingCall);
-    auto *acceptFailed = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, accepted);
-    acceptFailed->setTargetState(m_popupsByView.value(Views::CallAnswerNotResponding));
-    auto *waitingRemoteRejection = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneWaitingCallRemoteRejection, nullptr);
-    connect(waitingRemoteRejection, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::dismissWaitingCall);
-    list(WaitingCallRemoteRejection, waitingRemoteRejection);
-    m_waitingCallPopup->setInitialState(ringing);
-
-    // Redial and call ended only close their popups.
-    PopupState *redial = m_popupsByView.value(Views::Redial);
-    auto *redialRequested = new HmiTransition(Events::HmiPhone_RedialRequest, redial);
-    connect(redialRequested, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::redialRequest);
-    auto *redialCancelled = new HmiTransition(Events::HmiPhone_CancelRedialRequest, redial);
-    connect(redialCancelled, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::cancelRedialRequest);
-    auto *callEndConfirmation = new HmiTransition(Events::HmiPhone_CallEndConfirmed,
-                                                  m_popupsByView.value(Views::CallEnded));
-    connect(callEndConfirmation, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::callEndConfirmed);
+    m_incomingCallPopup = popup(Views::IncomingCall);
+    m_waitingCallPopup = popup(Views::WaitingCall);
 
     // Text-message alerts: the multiple-messages alert replaces both single-message alerts.
-    m_multipleTextMessagesPopup = m_popupsByView.value(Views::MultipleTextMessagesReceived);
+    m_multipleTextMessagesPopup = popup(Views::MultipleTextMessagesReceived);
     connect(m_multipleTextMessagesPopup, &QAbstractState::entered, this,
             &HmiPhoneGlobalStateHandler::enableMultipleMessagesState);
     connect(m_multipleTextMessagesPopup, &QAbstractState::exited, this,
             &HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout);
-    m_popupsByView.value(Views::NewTextMessageAlert1)
-            ->registerDismissingPopup(m_multipleTextMessagesPopup);
-    m_newTextMessageAlertPopup = m_popupsByView.value(Views::NewTextMessageAlert2);
+    popup(Views::NewTextMessageAlert1)->registerDismissingPopup(m_multipleTextMessagesPopup);
+    m_newTextMessageAlertPopup = popup(Views::NewTextMessageAlert2);
     connect(m_newTextMessageAlertPopup, &QAbstractState::entered, this,
             &HmiPhoneGlobalStateHandler::enableSingleMessageState);
     connect(m_newTextMessageAlertPopup, &QAbstractState::exited, this,
             &HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout);
     m_newTextMessageAlertPopup->registerDismissingPopup(m_multipleTextMessagesPopup);
 
-    connect(m_popupsByView.value(Views::PhoneSmsSendTextMessageSuccess), &QAbstractState::exited,
-            m_controller, &HmiPhoneController::viewTextMessages);
+    connect(popup(Views::PhoneSmsSendTextMessageSuccess), &QAbstractState::exited, m_controller,
+            &HmiPhoneController::viewTextMessages);
 }
 
-void HmiPhoneGlobalStateHandler::createCallTransitions(Phone_Cmp *phoneCmp)
+// The global transition chart: one statement per row, in the order of creation (the row
+// vocabulary is in hmiphoneglobalchart.h). list(n) is the row's place n in the root-hierarchy
+// transition list, at level 3 unless L2 is given; a row without list() keeps its source state.
+//
+// Adding a row: write it at its place in the creation order, where the bracketed note says,
+// not at the end: transitions sharing a trigger are offered it in creation order. Its slots
+// and guard are private slots of the handler, declared in the header and defined in any of its
+// source units. A row whose guard or slots reach the transition through a handler field stores
+// it there with keep(). Then mark the row as armed in the structure test's list and take its
+// guard off that test's pending list.
+void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_Cmp *phoneCmp)
 {
-    auto *endCallRequest = new HmiTransition(Events::HmiPhone_EndCallRequest, nullptr);
-    connect(endCallRequest, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::endCall);
-    list(EndCallRequest, endCallRequest);
+    using H = HmiPhoneGlobalStateHandler;
+    using PM = HmiPhonePopupManager;
+    using Mavrosk::PhoneSource;
+    namespace Status = CallStatus;
+    const auto L2 = Quorvel::StateLevel2;
+    PhoneSource *phone = m_phoneSource;
+    PM *pm = m_popupManager;
+
+    // clang-format off
+
+    // --- With the popups ---------------------------------------------------------------------
+
+    // "IncomingCall": the driver's or the caller's answer.
+    chart.event(Events::HmiPhone_RejectIncomingCall).run(&H::rejectIncomingCall).list(110);
+    chart.event(Events::HmiPhone_AcceptIncomingCall).run(&H::acceptIncomingCall).list(111);
+    chart.signal(phone, &PhoneSource::phoneIncomingCallRemoteRejection)
+            .run(&H::rejectIncomingCall).list(77);
+
+    // "WaitingCall": ringing, then rejected or accepted; an accepted call the phone fails to take
+    // turns into "CallAnswerNotResponding".
+    auto *ringing = new QState(m_waitingCallPopup);
+    ringing->setObjectName(QStringLiteral("WaitingCallRinging"));
+    auto *rejected = new QState(m_waitingCallPopup);
+    rejected->setObjectName(QStringLiteral("WaitingCallRejected"));
+    auto *accepted = new QState(m_waitingCallPopup);
+    accepted->setObjectName(QStringLiteral("WaitingCallAccepted"));
+    chart.event(Events::HmiPhone_RejectWaitingCall, ringing).to(rejected).run(&H::rejectIncomingCall);
+    chart.event(Events::HmiPhone_AcceptWaitingCall, ringing).to(accepted).run(&H::acceptIncomingCall);
+    chart.signal(phone, &PhoneSource::phoneCallAcceptingFailed, accepted)
+            .to(popup(Views::CallAnswerNotResponding));
+    chart.signal(phone, &PhoneSource::phoneWaitingCallRemoteRejection)
+            .run(pm, &PM::dismissWaitingCall).list(76);
+    m_waitingCallPopup->setInitialState(ringing);
+
+    // "Redial" and "CallEnded" only close.
+    chart.event(Events::HmiPhone_RedialRequest, popup(Views::Redial)).run(&H::redialRequest);
+    chart.event(Events::HmiPhone_CancelRedialRequest, popup(Views::Redial)).run(&H::cancelRedialRequest);
+    chart.event(Events::HmiPhone_CallEndConfirmed, popup(Views::CallEnded)).run(&H::callEndConfirmed);
+
+    // [the five "NewTextMessageAlert2" rows; the "PhoneSmsTextMessagingOff" row]
+
+    // --- Device and calls --------------------------------------------------------------------
+
+    // Adding a phone: from the phone's screens, or when the voice system asks for the pairing.
+    chart.event(Events::HmiPhone_AddPhoneRequest, phoneCmp).run(&H::addPhoneRequested).list(7);
+    chart.signal(m_speechSource, &Mavrosk::SpeechSource::displayPairingPopup).voiceEvent()
+            .run(Taldris::HmiIntentRequest(14, {ModuleName}, false, true, QVariant())).list(8);
+    chart.event(Events::HmiPhone_EndCallRequest).run(&H::endCall).list(9);
 
     // The phone rings: two guarded transitions on the same change of "incomingCall" split the
     // start and the end of the ringing; a projection that gives the call back starts it too.
-    m_incomingCallTransition
-            = new GuardedPropertyTransition(m_phoneSource, "incomingCall", nullptr);
-    connect(m_incomingCallTransition, &GuardedSignalTransition::transitionTest, this,
-            &HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest);
-    connect(m_incomingCallTransition, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::incomingCall);
-    list(IncomingCallChanged, m_incomingCallTransition);
+    chart.property(phone, "incomingCall").keep(m_incomingCallTransition)
+            .guard(&H::incomingCallTransitionEventTest).run(&H::incomingCall).list(10);
+    chart.guardedSignal(m_projectionSource, &Mavrosk::ProjectionSource::projectionNotActive)
+            .keep(m_incomingCallOnProjectionDisconnectTransition)
+            .guard(&H::incomingCallonPrjDisconnectTransitionEventTest)
+            .run(&H::incomingCall).list(114);
+    chart.signal(phone, &PhoneSource::phoneCallAcceptingFailed)
+            .run(pm, &PM::showCallAcceptanceFailure).list(45);
+    chart.property(phone, "incomingCall").keep(m_missedCallTransition)
+            .guard(&H::missedCallTransitionEventTest).run(&H::incomingCallOutbound).list(11);
+    chart.signal(phone, &PhoneSource::multipartyActiveCallEnded)
+            .run(&H::hidePhoneDialingTransientMessage).run(&H::showCallEnded).list(66);
+    chart.guardedSignal(phone, &PhoneSource::missedCallsPresent)
+            .guard(&H::missedCallPresentTransitionEventTest)
+            .run(pm, &PM::dismissIncomingCall).run(pm, &PM::showMissedCall).list(55);
 
-    m_incomingCallOnProjectionDisconnectTransition = new GuardedSignalTransition(
-            m_projectionSource, &Mavrosk::ProjectionSource::projectionNotActive, nullptr);
-    connect(m_incomingCallOnProjectionDisconnectTransition,
-            &GuardedSignalTransition::transitionTest, this,
-            &HmiPhoneGlobalStateHandler::incomingCallonPrjDisconnectTransitionEventTest);
-    connect(m_incomingCallOnProjectionDisconnectTransition, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::incomingCall);
-    list(ProjectionNotActive, m_incomingCallOnProjectionDisconnectTransition);
+    // The call status: dialling, entering the call screens, connected outgoing calls; only a
+    // single call getting through clears a dialling failure still on screen.
+    chart.change(phone, "status", {}, Status::OutgoingSetUp).parallelExclusive(0)
+            .run(&H::showPhoneDialingTransientMessage).list(64);
+    chart.change(phone, "status", {}, Status::OutgoingSetUpBesideCall).parallelExclusive(0)
+            .run(&H::showPhoneDialingTransientMessage).list(65);
+    chart.property(phone, "status").parallelExclusive(1).keep(m_callConnectedTransition)
+            .to(phoneCmp->phoneCallCompositeState())
+            .guard(&H::callConnectedTransitionEventTest).list(17);
+    chart.change(phone, "callConnected", {false}, true)
+            .run(Brisken::DismissPopup(Views::PhoneSmsDownloading))
+            .run(Brisken::DismissPopup(Views::PhoneBookDownloading)).list(18);
+    chart.change(phone, "status", {Status::OutgoingSetUp}, Status::OneCallConnected)
+            .parallelExclusive(0)
+            .run(&H::showPhoneConnectedOutgoingCallTransientMessage).run(&H::hideDialingFailed).list(12);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideCall}, Status::SwappableCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(13);
+    chart.change(phone, "status", {Status::OutgoingSetUpBesideTwoCalls}, Status::TwoCallsConnected)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(14);
+    chart.change(phone, "status", {Status::OutgoingSetUpRefusing}, Status::FurtherCallRefused)
+            .parallelExclusive(0).run(&H::showPhoneConnectedOutgoingCallTransientMessage).list(15);
+    chart.change(phone, "privateMode", {}, 1).run(&H::hideCallKeyPad).list(16);
 
-    auto *acceptingFailed = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneCallAcceptingFailed, nullptr);
-    connect(acceptingFailed, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::showCallAcceptanceFailure);
-    list(CallAcceptingFailed, acceptingFailed);
-
-    m_missedCallTransition = new GuardedPropertyTransition(m_phoneSource, "incomingCall", nullptr);
-    connect(m_missedCallTransition, &GuardedSignalTransition::transitionTest, this,
-            &HmiPhoneGlobalStateHandler::missedCallTransitionEventTest);
-    connect(m_missedCallTransition, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::incomingCallOutbound);
-    list(IncomingCallEnded, m_missedCallTransition);
-
-    auto *multipartyEnded = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::multipartyActiveCallEnded, nullptr);
-    connect(multipartyEnded, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage);
-    connect(multipartyEnded, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::showCallEnded);
-    list(MultipartyActiveCallEnded, multipartyEnded);
-
-    auto *missedCalls = new GuardedSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::missedCallsPresent, nullptr);
-    connect(missedCalls, &GuardedSignalTransition::transitionTest, this,
-            &HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest);
-    connect(missedCalls, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::dismissIncomingCall);
-    connect(missedCalls, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::showMissedCall);
-    list(MissedCallsPresent, missedCalls);
-
-    // The call status: dialling, entering the call screens, connected outgoing calls.
-    const auto statusChange = [this](const QVariantList &from, int to) {
-        auto *transition = new GuardedPropertyChangeTransition(m_phoneSource, "status", from,
-                                                               QVariant(to), nullptr);
-        transition->makeParallelExclusive(0);
-        return transition;
-    };
-    auto *dialing3 = statusChange({}, 3);
-    connect(dialing3, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::showPhoneDialingTransientMessage);
-    list(DialingStatus3, dialing3);
-    auto *dialing4 = statusChange({}, 4);
-    connect(dialing4, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::showPhoneDialingTransientMessage);
-    list(DialingStatus4, dialing4);
-
-    m_callConnectedTransition = new GuardedPropertyTransition(m_phoneSource, "status", nullptr);
-    m_callConnectedTransition->makeParallelExclusive(1);
-    m_callConnectedTransition->setTargetState(phoneCmp->phoneCallCompositeState());
-    connect(m_callConnectedTransition, &GuardedSignalTransition::transitionTest, this,
-            &HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest);
-    list(CallConnected, m_callConnectedTransition);
-
-    auto *callConnectedNow = new GuardedPropertyChangeTransition(
-            m_phoneSource, "callConnected", {QVariant(false)}, QVariant(true), nullptr);
-    connect(callConnectedNow, &QAbstractTransition::triggered, this,
-            Brisken::DismissPopup(Views::PhoneSmsDownloading));
-    connect(callConnectedNow, &QAbstractTransition::triggered, this,
-            Brisken::DismissPopup(Views::PhoneBookDownloading));
-    list(CallConnectedBecomesTrue, callConnectedNow);
-
-    const struct
-    {
-        int from;
-        int to;
-        ListPosition position;
-    } outgoingConnected[] = {{3, 7, OutgoingConnected3To7},
-                             {4, 9, OutgoingConnected4To9},
-                             {5, 10, OutgoingConnected5To10},
-                             {6, 11, OutgoingConnected6To11}};
-    for (const auto &passage : outgoingConnected) {
-        auto *transition = statusChange({QVariant(passage.from)}, passage.to);
-        connect(transition, &QAbstractTransition::triggered, this,
-                &HmiPhoneGlobalStateHandler::showPhoneConnectedOutgoingCallTransientMessage);
-        // Only a single call getting through clears a dialling failure still on screen.
-        if (passage.from == 3)
-            connect(transition, &QAbstractTransition::triggered, this,
-                    &HmiPhoneGlobalStateHandler::hideDialingFailed);
-        list(passage.position, transition);
-    }
-
-    auto *privateModeOn = new GuardedPropertyChangeTransition(m_phoneSource, "privateMode", {},
-                                                              QVariant(1), nullptr);
-    connect(privateModeOn, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::hideCallKeyPad);
-    list(PrivateModeOn, privateModeOn);
+    // The contacts download starts, stops, and finishes (2 to 1 is both).
+    chart.change(phone, "phoneBookStatus", {}, 2)
+            .run(&H::showPhonebookDownloadInitiatedTransientMessage).list(84);
+    chart.change(phone, "phoneBookStatus", {2}, QVariant())
+            .run(&H::hidePhonePhonebookDownloadInitiatedTransientMessage).list(85);
+    chart.change(phone, "phoneBookStatus", {2}, 1)
+            .run(&H::handlePhonebookDownloadCompleteDisplay).list(83);
+    chart.event(Events::HmiPhone_RetryPhnBookDownloadAccessRequest)
+            .run(&H::handleRetryPhnBookDownloadContactAccess).list(92);
+    chart.event(Events::HmiPhone_RetryAutomaticContactDownloadRequest)
+            .run(&H::handleRetryPhnBookAutomaticContactDownload).list(93);
 
     // Dialling failures.
-    auto *issueFix = new HmiTransition(Events::HmiPhone_PhoneIssueFixRequest, nullptr);
-    connect(issueFix, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::showDeviceIssueFixHint);
-    list(PhoneIssueFixRequest, issueFix);
-    auto *dialingFailed = new IntSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneDialingFailed, 1, nullptr);
-    connect(dialingFailed, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::handleDialingFailure);
-    list(DialingFailed1, dialingFailed);
-    auto *noSignal = new IntSignalTransition(m_phoneSource,
-                                             &Mavrosk::PhoneSource::phoneDialingFailed, 0, nullptr);
-    connect(noSignal, &QAbstractTransition::triggered, m_popupManager,
-            &HmiPhonePopupManager::showNoCellularSignal);
-    list(DialingFailed0, noSignal);
+    chart.event(Events::HmiPhone_PhoneIssueFixRequest).run(pm, &PM::showDeviceIssueFixHint).list(32);
+    chart.intSignal(phone, &PhoneSource::phoneDialingFailed, 1).run(&H::handleDialingFailure).list(33);
+    chart.intSignal(phone, &PhoneSource::phoneDialingFailed, 0).run(pm, &PM::showNoCellularSignal).list(34);
 
-    auto *stopAnsweringRequest = new HmiTransition(Events::HmiPhone_StopAnswering, nullptr);
-    connect(stopAnsweringRequest, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::stopAnswering);
-    list(StopAnswering, stopAnsweringRequest);
-}
+    // Siri is not available.
+    chart.event(Events::HmiPhone_ShowSiriNotEnabledRequest)
+            .run(pm, &PM::showSiriNotEnabledErrorPopup).list(101);
+    chart.signal(phone, &PhoneSource::phoneSiriSCOchannelNotActiveReceived)
+            .run(pm, &PM::showSiriNotEnabledErrorPopup).list(102);
+    chart.event(Events::HmiPhone_StopAnswering).run(&H::stopAnswering).list(39);
 
-void HmiPhoneGlobalStateHandler::createCallRequestTransitions(Phone_Cmp *phoneCmp)
-{
-    auto *confirmRoaming = new HmiTransition(Events::HmiPhone_ConfirmRoamingCall, nullptr);
-    connect(confirmRoaming, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::roamingCallConfirmed);
-    list(ConfirmRoamingCall, confirmRoaming);
-    auto *cancelRoaming = new HmiTransition(Events::HmiPhone_CancelRoamingCall, nullptr);
-    connect(cancelRoaming, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::roamingCallCancelled);
-    list(CancelRoamingCall, cancelRoaming);
+    // --- Keys --------------------------------------------------------------------------------
 
-    auto *statusAlerts = new HmiTransition(Events::HmiPhone_ShowStatusBarAlertsRequest, nullptr);
-    statusAlerts->setTargetState(phoneCmp->phoneStatusAlerts());
-    list(ShowStatusBarAlertsRequest, statusAlerts);
+    // One key event may satisfy several rows; the guards keep the always-armed ones apart. The
+    // "WaitingCall" rows listen only while that popup is open, unguarded, and add its dismissal
+    // to what the always-armed row of the same key does.
+    PM *keyPopups = HmiPhonePopupManager::instance();
+    const int Press = KeyPress::Press, Short = KeyPress::ShortPress, Long = KeyPress::LongPress,
+              Release = KeyPress::LongPressRelease;
+    const auto notProjected = &H::isProjectionNotActive;
+    PopupState *waiting = m_waitingCallPopup;
+    chart.key(Key::Phone, Short).keep(m_phoneKeyTransition)
+            .guard(&H::phoneKeyTransitionEventTest).to(phoneCmp).list(1);
+    chart.key(Key::Phone, Short).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(2);
+    chart.key(Key::Phone, Long).keep(m_phoneEndCallKeyTransition)
+            .guard(&H::phoneEndCallKeyTransitionEventTest).run(&H::processRejectKeyPhone).list(20);
+    chart.key(Key::Phone, Long).guard(&H::incomingCallKeySignalTransitionEventTest)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissIncomingCall).list(21);
+    chart.key(Key::Phone, Short).keep(m_multipartySwitchKeyTransition)
+            .guard(&H::phoneMultipartySwitchKeyTransitionEventTest)
+            .run(&H::processMultipartySinglePressPhone).list(31);
+    chart.key(Key::Phone, Short, waiting)
+            .run(&H::acceptIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::Phone, Long, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::AcceptOrSeekLeft, Press).guard(notProjected).run(&H::processAcceptOrSeek).list(19);
+    chart.key(Key::AcceptOrSeekLeft, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::RejectOrSeekRight, Press).guard(notProjected).run(&H::processRejectOrSeek).list(22);
+    // The same press as the row above, which posts the rejection to this very popup.
+    chart.key(Key::RejectOrSeekRight, Press, waiting).runLater(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(23);
+    chart.key(Key::SendAccept, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(24);
+    chart.key(Key::EndReject, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SendAccept2, Press).guard(notProjected).run(&H::processPhoneSendAcceptKey).list(3);
+    chart.key(Key::SendAccept2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::EndReject2, Press).guard(notProjected).run(&H::processPhoneEndRejectKey).list(4);
+    chart.key(Key::EndReject2, Short, waiting).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekDown, Short).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeek).list(25);
+    chart.key(Key::SteeringWheelSeekUp, Short, waiting)
+            .run(&H::rejectIncomingCall).run(keyPopups, &PM::dismissWaitingCall);
+    chart.key(Key::SteeringWheelSeekUp, Short).guard(notProjected)
+            .run(&H::processSWCRejectOrSeek).list(26);
+    chart.key(Key::SteeringWheelSeekDown, Long).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongPress).list(27);
+    chart.key(Key::SteeringWheelSeekDown, Release).guard(notProjected)
+            .run(&H::processSWCAcceptOrSeekLongRelease).list(28);
+    chart.key(Key::SteeringWheelSeekUp, Long).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongPress).list(29);
+    chart.key(Key::SteeringWheelSeekUp, Release).guard(notProjected)
+            .run(&H::processSWCRejectOrSeekLongRelease).list(30);
 
+    // --- Requests, messages and connection ---------------------------------------------------
+
+    // Roaming confirmation.
+    chart.event(Events::HmiPhone_ConfirmRoamingCall).run(&H::roamingCallConfirmed).list(35);
+    chart.event(Events::HmiPhone_CancelRoamingCall).run(&H::roamingCallCancelled).list(36);
+    chart.property(phone, "deviceBatteryLevel").keep(m_batteryLevelTransition)
+            .guard(&H::batteryLevelTransitionEventTest).run(pm, &PM::showBatteryLow).list(37);
+    chart.event(Events::HmiPhone_ShowStatusBarAlertsRequest).to(phoneCmp->phoneStatusAlerts()).list(38);
+    // [the five text-message request and status rows]
+    // The call moves to the handset (stand-by) and back.
+    chart.property(phone, "status").parallelExclusive(0).keep(m_standbyTransition)
+            .guard(&H::standbyTransitionEventTest).run(pm, &PM::showTransferToPhone).list(40);
+    chart.change(phone, "status", {12}, QVariant()).parallelExclusive(0)
+            .run(pm, &PM::hideTransferToPhone).list(41);
+    // The link drops: the popup during a call, the reconnect notice without one; the door opened
+    // after a failed reconnection; the phone back.
+    chart.guardedSignal(phone, &PhoneSource::nonUserDeviceDisconnectReceived)
+            .keep(m_connectionLostTransition).guard(&H::showPhoneConnectionLostTest)
+            .run(pm, &PM::showPhoneConnectionLost).list(42);
+    chart.guardedSignal(phone, &PhoneSource::nonUserDeviceDisconnectReceived)
+            .keep(m_attemptingReconnectTransition).guard(&H::showPhoneAttemptingReconnectTest)
+            .run(&H::showPhoneAttemptingReconnectTransient).list(43);
+    chart.change(m_bluetoothSource, "deviceConnected", {false}, true)
+            .run(&H::handleLinklossReconnectSuccessTransition).list(91);
+    chart.guardedSignal(phone, &PhoneSource::phoneDriverDoorOpenLinkLossReconnectFailedReceived)
+            .keep(m_doorOpenLinklossTransition).guard(&H::showPhoneDoorOpenLinklossTest)
+            .run(pm, &PM::showPhoneConnectionLost).run(pm, &PM::hideSendTextMessage).list(88);
+    chart.guardedSignal(phone, &PhoneSource::phoneDriverDoorOpenLinkLossReconnectFailedReceived)
+            .keep(m_doorNoCallOpenLinklossTransition).guard(&H::showPhoneDoorNoCallOpenLinklossTest)
+            .run(pm, &PM::showUnableToConnect).run(pm, &PM::hideSendTextMessage).list(89);
+    chart.signal(phone, &PhoneSource::deviceReconnectFailReceived)
+            .run(pm, &PM::showUnableToConnect).list(75);
+    // [new message, listen and message details]
     // The root component dials, or asks for the roaming warning first.
-    auto *makeCallRequest = new HmiTransition(Events::HmiPhone_MakeCallRequest, nullptr);
-    connect(makeCallRequest, &QAbstractTransition::triggered, phoneCmp, &Phone_Cmp::makeCall);
-    list(MakeCallRequest, makeCallRequest);
-}
+    chart.event(Events::HmiPhone_MakeCallRequest).run(phoneCmp, &Phone_Cmp::makeCall).list(47);
+    // [reply and send; deviceConnectedChanged(bool)]
 
-void HmiPhoneGlobalStateHandler::createScreenRequestTransitions(Phone_Cmp *phoneCmp)
-{
-    auto *connectToDevice = new HmiTransition(Events::HmiPhone_ShowConnectToDevice, nullptr);
-    connectToDevice->setTargetState(phoneCmp->addPhoneState());
-    list(ShowConnectToDevice, connectToDevice);
-    auto *rootState = new HmiTransition(Events::HmiPhone_RootStateRequest, nullptr);
-    rootState->setTargetState(phoneCmp);
-    list(RootStateRequest, rootState);
+    // --- Extended mode, errors and screens asked for from elsewhere --------------------------
 
-    auto *roamingMode = new HmiTransition(Events::HmiPhone_RoamingMode, nullptr);
-    connect(roamingMode, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::handleRoamingWarning);
-    list(RoamingModeRequest, roamingMode);
-    auto *roamingReceived = new HmiSignalTransition(
-            m_phoneSource, &Mavrosk::PhoneSource::phoneRoamingModeReceived, nullptr);
-    connect(roamingReceived, &QAbstractTransition::triggered, this,
-            &HmiPhoneGlobalStateHandler::handleRoamingWarning);
-    list(RoamingModeReceived, roamingReceived);
-}
+    // Extended mode, heard while the stand-by popup is up; the countdown runs on after it closes.
+    PopupState *standby = popup(Views::PhoneCallStandByModePopup);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 2, standby)
+            .run(&H::handleExtendedModeChangeRequest).list(71);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 3, standby)
+            .run(&H::handleExtendedModeChangeRequest).list(72);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 1, standby)
+            .run(pm, &PM::hidePhoneCallStandByModePopup).run(&H::clearExtendedModeTimer)
+            .run(&H::handleExtendedModeChangeRequest).list(69);
+    chart.intSignal(phone, &PhoneSource::currentExtendedModeChanged, 0, standby)
+            .run(pm, &PM::hidePhoneCallStandByModePopup).run(&H::clearExtendedModeTimer).list(73);
+    chart.event(Events::HmiPhone_PrivacyRequestOn, standby)
+            .run(phone, &PhoneSource::togglePrivacyMode).run(&H::clearExtendedModeTimer).list(70);
+    chart.event(Events::HmiPhone_ClearExtendedModeTimer, standby)
+            .run(&H::clearExtendedModeTimer).list(94);
+    m_extendedModeTimer = new QTimer(this);
+    m_extendedModeTimer->setInterval(60000);
+    connect(m_extendedModeTimer, &QTimer::timeout, this, &H::extendedModeTimerMinuteElapsed);
 
-void HmiPhoneGlobalStateHandler::createContactsRequestTransition(Phone_Cmp *phoneCmp)
-{
-    auto *contacts = new HmiTransition(Events::HmiPhone_ShowContactsRequest, nullptr);
-    contacts->setTargetState(phoneCmp->phoneBookCompositeState());
-    list(ShowContactsRequest, contacts, Quorvel::StateLevel2);
+    // Errors: those of a call only while one is connected.
+    chart.guardedSignal(phone, &PhoneSource::dtmfKeyPressNoResponseErrorReceived)
+            .keep(m_dtmfNoResponseErrorTransition).guard(&H::dtmfKeyPressNoResponseErrorEventTest)
+            .run(pm, &PM::showDTMFKeyPressNoResponseErrorPopup).list(67);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioTransferErrorReceived)
+            .keep(m_audioTransferErrorTransition).guard(&H::phoneAudioTransferErrorEventTest)
+            .run(pm, &PM::showPhoneAudioTransferErrorPopup).list(68);
+    chart.signal(phone, &PhoneSource::unstableDeviceConnectionWithKovaReceived)
+            .run(pm, &PM::showUnstableConnectionWithKovaPopup).list(74);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioHandsfreeErrorReceived)
+            .keep(m_audioHandsfreeErrorTransition).guard(&H::phoneAudioHandsfreeErrorEventTest)
+            .run(pm, &PM::showHandsFreeError).list(78);
+    chart.signal(phone, &PhoneSource::phoneSiriNoResponseErrorReceived)
+            .run(pm, &PM::showPhoneSiriNoResponseErrorPopup).list(80);
+    chart.guardedSignal(phone, &PhoneSource::phoneAudioInternalErrorReceived)
+            .keep(m_audioInternalErrorTransition).guard(&H::phoneAudioInternalErrorEventTest)
+            .run(pm, &PM::showPhoneSiriNoResponseErrorPopup).list(81);
+    chart.signal(phone, &PhoneSource::phoneContactsTooLargeErrorReceived)
+            .run(pm, &PM::showPhoneContactsTooLargeErrorPopup).list(82);
+
+    chart.event(Events::HmiPhone_ShowConnectToDevice).to(phoneCmp->addPhoneState()).list(90);
+    chart.event(Events::HmiPhone_RootStateRequest).to(phoneCmp).list(99);
+    chart.event(Events::HmiPhone_RoamingMode).run(&H::handleRoamingWarning).list(100);
+    chart.signal(phone, &PhoneSource::phoneRoamingModeReceived).run(&H::handleRoamingWarning).list(79);
+
+    // --- Voice service and contacts ----------------------------------------------------------
+
+    // The phone's voice assistant listens: a message while it does, offered again when the phone
+    // menu is left or the status bar comes or goes, removed when it stops or the menu is entered.
+    // What needs the status bar is wired only when there is one; the popup goes in any case.
+    auto siriOn = chart.change(phone, "siriActive", {false}, true).parallelExclusive(2).list(103, L2);
+    auto siriOff = chart.change(phone, "siriActive", {true}, false).list(104, L2);
+    auto voiceOn = chart.change(phone, "phoneVoiceServiceActive", {false}, true)
+            .parallelExclusive(2).list(105, L2);
+    auto voiceOff = chart.change(phone, "phoneVoiceServiceActive", {true}, false).list(106, L2);
+    auto menuExited = chart.signal(m_controller, &HmiPhoneController::phoneMenuExited).list(108, L2);
+    auto menuEntered = chart.signal(m_controller, &HmiPhoneController::phoneMenuEntered).list(109, L2);
+    const QString &voiceMessage = Transients::PhoneVoiceServiceActivatedTransientMsg;
+    const QString &voicePopup = Views::PhoneVoiceServiceActivatedPopup;
+    if (Brisken::StatusBarController *statusBar = statusBarController()) {
+        const Brisken::ConditionalShowTransientOrPopupRequest whileSiri(
+                statusBar, voiceMessage, voicePopup, phone, "siriActive", true);
+        const Brisken::ConditionalShowTransientOrPopupRequest whileVoiceService(
+                statusBar, voiceMessage, voicePopup, phone, "phoneVoiceServiceActive", true);
+        const Brisken::ShowTransientOrPopupRequest show(statusBar, voiceMessage, voicePopup);
+        const Brisken::HideTransientRequest hide(statusBar, voiceMessage);
+        chart.signal(statusBar, &Brisken::StatusBarController::statusBarVisibleChanged)
+                .run(whileSiri).run(whileVoiceService).list(5, L2);
+        siriOn.run(show);
+        siriOff.run(hide);
+        voiceOn.run(show);
+        voiceOff.run(hide);
+        menuExited.run(whileSiri).run(whileVoiceService);
+        menuEntered.run(hide);
+    }
+    siriOff.run(Brisken::DismissPopup(voicePopup));
+    voiceOff.run(Brisken::DismissPopup(voicePopup));
+    menuEntered.run(Brisken::DismissPopup(voicePopup));
+    chart.event(Events::HmiPhone_ShowContactsRequest).to(phoneCmp->phoneBookCompositeState()).list(6, L2);
+    // [the two dismissing rows of "PhoneSmsSendTextMessage"]
+
+    // clang-format on
 }
 
 // --- Call reactions ----------------------------------------------------------------------------
@@ -511,7 +548,7 @@ void HmiPhoneGlobalStateHandler::incomingCall()
 {
     // A call the driver cannot take now is refused at once, without a popup or a transient.
     if (m_phoneSource->doNotDisturb() || m_phoneSource->multipleCallsConnected()
-        || m_phoneSource->status() == 11) {
+        || m_phoneSource->status() == CallStatus::FurtherCallRefused) {
         m_phoneSource->rejectIncomingCall();
         return;
     }
@@ -524,12 +561,15 @@ void HmiPhoneGlobalStateHandler::incomingCall()
     }
 }
 
+// The ringing has ended, whatever ended it. A call answered on the handset may be reported
+// connected before the ringing ends, so "IncomingCall" cannot be told from "WaitingCall" by the
+// connection: "IncomingCall", which has no auto-dismiss, is always closed, "WaitingCall" as well
+// while a call is connected.
 void HmiPhoneGlobalStateHandler::incomingCallOutbound()
 {
     if (m_phoneSource->callConnected())
         m_popupManager->dismissWaitingCall();
-    else
-        m_popupManager->dismissIncomingCall();
+    m_popupManager->dismissIncomingCall();
 }
 
 void HmiPhoneGlobalStateHandler::acceptIncomingCall()
@@ -606,12 +646,12 @@ void HmiPhoneGlobalStateHandler::roamingCallCancelled()
 void HmiPhoneGlobalStateHandler::handleDialingFailure()
 {
     switch (m_phoneSource->status()) {
-    case 3:
-    case 4:
-    case 5:
-    case 6:
-    case 0:
-    case 1:
+    case CallStatus::OutgoingSetUp:
+    case CallStatus::OutgoingSetUpBesideCall:
+    case CallStatus::OutgoingSetUpBesideTwoCalls:
+    case CallStatus::OutgoingSetUpRefusing:
+    case CallStatus::NoCall:
+    case CallStatus::SetUpOrFailure:
         // Two failures in a row show the ordinary popup, the third the one with more help.
         if (m_dialingFailureCount > 1) {
             m_dialingFailureCount = 0;
@@ -647,14 +687,19 @@ void HmiPhoneGlobalStateHandler::onMissedCallPopupExited()
 
 void HmiPhoneGlobalStateHandler::addPhoneRequested()
 {
-    Taldris::HmiIntentManager::instance()->requestAction(14, {QVariant(ModuleName)}, false, false,
-                                                         QVariant());
+    Taldris::HmiIntentManager::instance()->requestAction(
+            IntentAction::PairPhone, {QVariant(ModuleName)}, false, false, QVariant());
 }
 
 // Posted through the controller, at normal priority, to the HMI's one machine, like every other
 // event of the module.
 void HmiPhoneGlobalStateHandler::postEvent(const QString &name)
 {
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneGlobalStateHandler: the controller is gone," << name
+                            << "not posted";
+        return;
+    }
     m_controller->postEvent(new Quorvel::HmiEvent(name, QVariant()));
 }
 
@@ -704,22 +749,6 @@ void HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage()
     hideTransient(Transients::PhoneOutgoingDialing);
 }
 
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadInitiatedTransientMessage()
-{
-    requestTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::hidePhonePhonebookDownloadInitiatedTransientMessage()
-{
-    hideTransient(Transients::PhonebookDownloadInitiated);
-}
-
-void HmiPhoneGlobalStateHandler::showPhonebookDownloadCompleteTransientMessage()
-{
-    if (m_bluetoothSource->deviceConnected())
-        requestTransient(Transients::PhonebookDownloadComplete);
-}
-
 // --- Text-message alert bookkeeping ------------------------------------------------------------
 
 void HmiPhoneGlobalStateHandler::enableSingleMessageState()
@@ -746,7 +775,8 @@ void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
 void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
 {
     m_textMessageAlertState = 0;
-    m_controller->resetRecievedTextMessageCount();
+    if (m_controller)
+        m_controller->resetRecievedTextMessageCount();
 }
 
 } // namespace HmiPhone

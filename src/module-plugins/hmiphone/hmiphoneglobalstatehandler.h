@@ -6,7 +6,7 @@
 #include <QList>
 #include <QObject>
 #include <QPair>
-#include <QVector>
+#include <QPointer>
 
 class QAbstractTransition;
 class QEvent;
@@ -40,6 +40,7 @@ class HardKeyController;
 
 namespace HmiPhone {
 
+class GlobalChart;
 class HmiPhoneController;
 class HmiPhonePopupManager;
 class Phone_Cmp;
@@ -104,6 +105,40 @@ private slots:
     void enableMultipleMessagesState();
     void resetAlertStateOnMultipleMessagesTimeout();
 
+    // Link loss and reconnection
+    void handleLinklossReconnectSuccessTransition();
+    void showPhoneAttemptingReconnectTransient();
+    void showPhoneConnectSuccessTransient();
+
+    // Extended mode: the minute countdown while "PhoneCallStandByModePopup" is concerned
+    void handleExtendedModeChangeRequest();
+    void clearExtendedModeTimer();
+    void extendedModeTimerMinuteElapsed();
+
+    // Contacts download and its retries
+    void handlePhonebookDownloadCompleteDisplay();
+    void handleRetryPhnBookDownloadContactAccess();
+    void handleRetryPhnBookAutomaticContactDownload();
+
+    // Not connected by the module; reachable through the meta-object
+    void retryPhoneBookDownload();
+    void retrySmsDownload();
+    void phoneFixHintTimeout();
+
+    // Phone keys: what each key does in the current call situation
+    void processAcceptOrSeek();
+    void processRejectOrSeek();
+    void processPhoneSendAcceptKey();
+    void processPhoneEndRejectKey();
+    void processRejectKeyPhone();
+    void processMultipartySinglePressPhone();
+    void processSWCAcceptOrSeek();
+    void processSWCRejectOrSeek();
+    void processSWCAcceptOrSeekLongPress();
+    void processSWCAcceptOrSeekLongRelease();
+    void processSWCRejectOrSeekLongPress();
+    void processSWCRejectOrSeekLongRelease();
+
     // Guard tests: each allows or blocks the transition that asks
     void incomingCallTransitionEventTest(QEvent *event);
     void incomingCallKeySignalTransitionEventTest(QEvent *event);
@@ -136,142 +171,15 @@ private slots:
     void smsMessageNotificationNotEnabledTest(QEvent *event);
 
 private:
-    // The places of the global transitions in the root-hierarchy list, in registration order
-    // (level 3 unless marked L2). This order is what the framework sees; transitions are
-    // collected here while they are built, in build order, and listed in this order at the end.
-    enum ListPosition : int {
-        PhoneKeyOpensPhone, // key 12 short press, enters the phone
-        PhoneKeyAcceptsCall, // key 12 short press, accepts a ringing call
-        SendKey79Press,
-        EndKey80Press,
-        StatusBarVisibleChanged, // L2, only with a status-bar controller
-        ShowContactsRequest, // L2
-        AddPhoneRequest,
-        DisplayPairingPopup,
-        EndCallRequest,
-        IncomingCallChanged,
-        IncomingCallEnded,
-        OutgoingConnected3To7,
-        OutgoingConnected4To9,
-        OutgoingConnected5To10,
-        OutgoingConnected6To11,
-        PrivateModeOn,
-        CallConnected,
-        CallConnectedBecomesTrue,
-        AcceptOrSeekKey77Press,
-        PhoneKeyEndsCall, // key 12 long press
-        PhoneKeyRejectsCall, // key 12 long press, rejects a ringing call
-        RejectOrSeekKey78Press,
-        SendKey49Press,
-        EndKey50Press,
-        SwcSeekDownShortPress,
-        SwcSeekUpShortPress,
-        SwcSeekDownLongPress,
-        SwcSeekDownLongRelease,
-        SwcSeekUpLongPress,
-        SwcSeekUpLongRelease,
-        PhoneKeyMultipartySwitch, // key 12 short press
-        PhoneIssueFixRequest,
-        DialingFailed1,
-        DialingFailed0,
-        ConfirmRoamingCall,
-        CancelRoamingCall,
-        DeviceBatteryLevel,
-        ShowStatusBarAlertsRequest,
-        StopAnswering,
-        StandbyStatus,
-        StandbyStatusLeft,
-        NonUserDisconnectCallLost,
-        NonUserDisconnectReconnecting,
-        NewTextMessageSingle,
-        CallAcceptingFailed,
-        NewTextMessageDetailsReady,
-        MakeCallRequest,
-        ShowMessageListRequested,
-        ListenToMessageRequested,
-        TextMessageDetailsReady,
-        NewTextMessageMultiple,
-        ShowReplyMessagesRequested,
-        SmsSendTextMessage,
-        ReplyMessageLineNoChanged,
-        MissedCallsPresent,
-        SmsInitiateSendTextMessage,
-        SendMessageStatus2,
-        SendMessageStatus1,
-        SendMessageStatus3,
-        SendMessageStatus0,
-        SmsRetrySendTextMessage,
-        SendMessageRequested,
-        CancelSendMessageRequested,
-        DialingStatus3,
-        DialingStatus4,
-        MultipartyActiveCallEnded,
-        DtmfNoResponseError,
-        AudioTransferError,
-        ExtendedMode1,
-        PrivacyRequestOn,
-        ExtendedMode2,
-        ExtendedMode3,
-        ExtendedMode0,
-        UnstableConnectionWithKova,
-        DeviceReconnectFail,
-        WaitingCallRemoteRejection,
-        IncomingCallRemoteRejection,
-        AudioHandsfreeError,
-        RoamingModeReceived,
-        SiriNoResponseError,
-        AudioInternalError,
-        ContactsTooLargeError,
-        PhoneBookStatus2To1,
-        PhoneBookStatusBecomes2,
-        PhoneBookStatusLeaves2,
-        ClusterHearItRequest,
-        ClusterIgnoreRequest,
-        DoorOpenLinklossCall,
-        DoorOpenLinklossNoCall,
-        ShowConnectToDevice,
-        DeviceConnectedBecomesTrue,
-        RetryPhnBookDownloadAccessRequest,
-        RetryAutomaticContactDownloadRequest,
-        ClearExtendedModeTimer,
-        ShowSmsNotificationEnabled,
-        ShowSmsNotificationDisabled,
-        ShowSmsStatusInMemory,
-        ShowSmsStatusNotInMemory,
-        RootStateRequest,
-        RoamingModeRequest,
-        ShowSiriNotEnabledRequest,
-        SiriScoChannelNotActive,
-        SiriActiveBecomesTrue, // L2
-        SiriActiveBecomesFalse, // L2
-        VoiceServiceActiveBecomesTrue, // L2
-        VoiceServiceActiveBecomesFalse, // L2
-        DeviceConnectedChanged,
-        PhoneMenuExited, // L2
-        PhoneMenuEntered, // L2
-        RejectIncomingCallRequest,
-        AcceptIncomingCallRequest,
-        ShowSmsIphoneRequest,
-        SendMessageNoResponseFromPhone,
-        ProjectionNotActive,
-        ListPositionCount
-    };
-
-    void list(ListPosition position, QAbstractTransition *transition,
-              Quorvel::StateLevel level = Quorvel::StateLevel3);
-
     void createPopupStates();
-    void createCallTransitions(Phone_Cmp *phoneCmp);
-    void createCallRequestTransitions(Phone_Cmp *phoneCmp);
-    void createScreenRequestTransitions(Phone_Cmp *phoneCmp);
-    void createContactsRequestTransition(Phone_Cmp *phoneCmp);
-    void listCollectedTransitions(Phone_Cmp *phoneCmp);
+    void buildTransitionChart(GlobalChart &chart, Phone_Cmp *phoneCmp);
+    Quorvel::PopupState *popup(const QString &view) const;
 
     void requestTransient(const QString &name);
     void hideTransient(const QString &name);
     void postEvent(const QString &name);
 
-    HmiPhoneController *m_controller;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
     HmiPhonePopupManager *m_popupManager;
     Brisken::ViewController *m_viewController;
     Brisken::ViewManager *m_viewManager;
@@ -321,8 +229,6 @@ private:
     Quorvel::HmiTransition *m_smsNotificationDisabledTransition;
     Quorvel::HmiTransition *m_smsNotificationEnabledTransition;
 
-    // Transitions built but not yet listed, by list position.
-    QVector<QPair<Quorvel::StateLevel, QAbstractTransition *>> m_collectedTransitions;
     // The global popup states by view identifier, for the wiring made while building.
     QHash<QString, Quorvel::PopupState *> m_popupsByView;
 };

@@ -4,6 +4,8 @@
 #include "hmiphoneglobalstatehandler.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 
 #include <brisken/viewmanager.h>
 #include <mavrosk/bluetoothsource.h>
@@ -19,11 +21,27 @@ namespace HmiPhone {
 
 namespace {
 
-// A guard whose transition is not built leaves nothing to decide.
+// The transition of a guard that reads it from its handler field. A guard asked while its field is
+// empty belongs to a chart row that does not keep() its transition: that transition would be
+// blocked for good, so it is said loudly.
+template<class Transition> Transition *guarded(Transition *transition)
+{
+    if (!transition)
+        qCWarning(hmiphone()) << "Guard asked without its transition: its chart row keeps none";
+    return transition;
+}
+
 template<class Transition> void allow(Transition *transition, bool allowed)
 {
-    if (transition)
+    if (guarded(transition))
         transition->setAllowTransition(allowed);
+}
+
+// Allows when the condition holds and otherwise leaves the transition blocked, as it starts.
+template<class Transition> void allowOnlyIf(Transition *transition, bool allowed)
+{
+    if (guarded(transition) && allowed)
+        transition->setAllowTransition(true);
 }
 
 } // namespace
@@ -34,7 +52,8 @@ void HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest(QEvent *)
     if (!transition)
         return;
     // A projection that owns the call but does not render it shows its own call screen.
-    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+    if (!m_projectionSource->isRendering()
+        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
         transition->setAllowTransition(false);
         return;
     }
@@ -46,7 +65,8 @@ void HmiPhoneGlobalStateHandler::incomingCallKeySignalTransitionEventTest(QEvent
     auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
     if (!transition)
         return;
-    if (!m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1) {
+    if (!m_projectionSource->isRendering()
+        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
         transition->setAllowTransition(false);
         return;
     }
@@ -61,14 +81,16 @@ void HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest(QEvent *)
         return;
     // A rendering projection tells the driver about missed calls itself.
     transition->setAllowTransition(
-            !(m_projectionSource->isRendering() && m_projectionSource->projectionMode() == 1));
+            !(m_projectionSource->isRendering()
+              && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection));
 }
 
 void HmiPhoneGlobalStateHandler::incomingCallonPrjDisconnectTransitionEventTest(QEvent *)
 {
     allow(m_incomingCallOnProjectionDisconnectTransition,
           !m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
-                  && Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+                  && Mavrosk::ProjectionSource::instance()->projectionMode()
+                          == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::missedCallTransitionEventTest(QEvent *)
@@ -78,17 +100,19 @@ void HmiPhoneGlobalStateHandler::missedCallTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
 {
-    if (!m_callConnectedTransition)
+    if (!guarded(m_callConnectedTransition))
         return;
     // The display context is asked first, and again for the second test; with a route active in
-    // context 5 the call screens stay closed whatever the call does.
-    const auto context = [this] { return m_viewManager ? m_viewManager->displayContext() : 0; };
+    // CallScreensWithoutRoute the call screens stay closed whatever the call does.
+    const auto context = [this] {
+        return m_viewManager ? m_viewManager->displayContext() : DisplayContext::Default;
+    };
     const auto callOngoing = [this] {
         return m_phoneSource->callConnected() || m_phoneSource->dialingInProgress();
     };
-    if (context() == 5)
+    if (context() == DisplayContext::CallScreensWithoutRoute)
         m_callConnectedTransition->setAllowTransition(!m_navSource->routeActive() && callOngoing());
-    else if (context() == 1)
+    else if (context() == DisplayContext::WithoutCallScreens)
         m_callConnectedTransition->setAllowTransition(false);
     else
         m_callConnectedTransition->setAllowTransition(callOngoing());
@@ -96,24 +120,25 @@ void HmiPhoneGlobalStateHandler::callConnectedTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::redialKeyTransitionEventTest(QEvent *)
 {
-    if (!m_bluetoothSource->deviceConnected())
-        return;
-    allow(m_phoneKeyTransition,
-          m_phoneSource->status() == 0 && m_projectionSource->projectionMode() == 0);
+    if (guarded(m_phoneKeyTransition) && m_bluetoothSource->deviceConnected())
+        allow(m_phoneKeyTransition,
+              m_phoneSource->status() == CallStatus::NoCall
+                      && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneKeyTransitionEventTest(QEvent *)
 {
     allow(m_phoneKeyTransition,
-          !m_phoneSource->incomingCall() && m_phoneSource->status() == 0
-                  && m_projectionSource->projectionMode() == 0);
+          !m_phoneSource->incomingCall() && m_phoneSource->status() == CallStatus::NoCall
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneMultipartySwitchKeyTransitionEventTest(QEvent *)
 {
     allow(m_multipartySwitchKeyTransition,
-          !m_phoneSource->privateMode() && m_phoneSource->status() == 9
-                  && m_projectionSource->projectionMode() == 0);
+          !m_phoneSource->privateMode()
+                  && m_phoneSource->status() == CallStatus::SwappableCallsConnected
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
@@ -122,7 +147,7 @@ void HmiPhoneGlobalStateHandler::phoneEndCallKeyTransitionEventTest(QEvent *)
             || m_phoneSource->multipleCallsConnected();
     allow(m_phoneEndCallKeyTransition,
           !m_phoneSource->privateMode() && callInProgress && !m_phoneSource->incomingCall()
-                  && m_projectionSource->projectionMode() == 0);
+                  && m_projectionSource->projectionMode() == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::isProjectionNotActive()
@@ -130,22 +155,22 @@ void HmiPhoneGlobalStateHandler::isProjectionNotActive()
     auto *transition = qobject_cast<Quorvel::KeySignalTransition *>(sender());
     if (!transition)
         return;
-    transition->setAllowTransition(Mavrosk::ProjectionSource::instance()->projectionMode() == 0);
+    transition->setAllowTransition(Mavrosk::ProjectionSource::instance()->projectionMode()
+                                   == ProjectionMode::None);
 }
 
 void HmiPhoneGlobalStateHandler::batteryLevelTransitionEventTest(QEvent *)
 {
-    if (!m_bluetoothSource->deviceConnected())
-        return;
-    allow(m_batteryLevelTransition,
-          m_phoneSource->lowBatteryNotification()
-                  && m_controller->shouldBatteryWarningBeShown(
-                          m_phoneSource->deviceBatteryLevel()));
+    if (guarded(m_batteryLevelTransition) && m_bluetoothSource->deviceConnected())
+        allow(m_batteryLevelTransition,
+              m_phoneSource->lowBatteryNotification() && m_controller
+                      && m_controller->shouldBatteryWarningBeShown(
+                              m_phoneSource->deviceBatteryLevel()));
 }
 
 void HmiPhoneGlobalStateHandler::standbyTransitionEventTest(QEvent *)
 {
-    allow(m_standbyTransition, m_phoneSource->status() == 12);
+    allow(m_standbyTransition, m_phoneSource->status() == CallStatus::Standby);
 }
 
 void HmiPhoneGlobalStateHandler::showPhoneConnectionLostTest(QEvent *)
@@ -172,14 +197,12 @@ void HmiPhoneGlobalStateHandler::showPhoneDoorNoCallOpenLinklossTest(QEvent *)
 // exactly one of them, and the other is left at its default (blocked).
 void HmiPhoneGlobalStateHandler::newTextMessageTest(QEvent *)
 {
-    if (m_textMessageAlertState == 0)
-        allow(m_newTextMessageTransition, true);
+    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == 0);
 }
 
 void HmiPhoneGlobalStateHandler::multipleNewTextMessagesTest(QEvent *)
 {
-    if (m_textMessageAlertState != 0)
-        allow(m_multipleNewTextMessagesTransition, true);
+    allowOnlyIf(m_multipleNewTextMessagesTransition, m_textMessageAlertState != 0);
 }
 
 void HmiPhoneGlobalStateHandler::requestedMessageDetailsReadyTest(QEvent *)

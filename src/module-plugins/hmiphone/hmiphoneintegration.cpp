@@ -45,7 +45,7 @@ HmiPhoneIntegration::HmiPhoneIntegration(QObject *parent)
     // Taking the shared instance here creates the popup manager before any phone state exists.
     , m_popupManager(HmiPhonePopupManager::instance())
     , m_globalStateHandler(nullptr)
-    , m_intentHandler(new HmiPhoneIntentHandler(m_controller, this))
+    , m_intentHandler(new HmiPhoneIntentHandler(m_controller.data(), this))
 {
     Taldris::HmiIntentManager::instance()->registerIntentHandler(m_intentHandler);
 }
@@ -112,6 +112,10 @@ void HmiPhoneIntegration::registerTypes()
 Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
 {
     qCDebug(hmiphone) << Q_FUNC_INFO;
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneIntegration: the controller is gone, no phone states built";
+        return nullptr;
+    }
     const QString rootStateId = rootStateIdentifier();
     auto *rootComponent = new Phone_Cmp(this, m_controller, rootStateId, parent);
     // The phone menu's entry and exit reach the views through the controller.

@@ -5,6 +5,7 @@
 #include <taldris/pellumcategory.h>
 
 #include <QObject>
+#include <QPointer>
 
 namespace HmiPhone {
 
@@ -40,7 +41,7 @@ public:
     QString createViewIdentifier(const QString &viewName) const;
 
 private:
-    HmiPhoneController *m_controller;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
     HmiPhonePopupManager *m_popupManager;
     HmiPhoneGlobalStateHandler *m_globalStateHandler;
     HmiPhoneIntentHandler *m_intentHandler;

@@ -2,6 +2,8 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
 #include <brisken/requestview.h>
@@ -14,16 +16,7 @@ namespace HmiPhone {
 
 namespace {
 
-enum Action {
-    CallNumber = 1,
-    PhoneSettings = 7,
-    AddPhone = 28,
-    StatusBarAlerts = 32,
-    SiriNotEnabled = 47,
-    PhoneRoot = 56,
-    PhoneBookStatusCheck = 67,
-    ManageContactsSettings = 68,
-};
+using namespace IntentAction;
 
 // The actions that only post an event to the HMI state machine.
 QString eventForAction(int action)
@@ -64,6 +57,10 @@ bool HmiPhoneIntentHandler::performAction(int action, const QVariantList &argume
     case CallNumber: {
         if (arguments.isEmpty() || !Mavrosk::BluetoothSource::instance()->deviceConnected())
             return false;
+        if (!m_controller) {
+            qCWarning(hmiphone) << "HmiPhoneIntentHandler: the controller is gone, no call placed";
+            return false;
+        }
         // A first argument that gives no number (a list, a map, an empty string) would dial
         // nothing while reporting a call as started: refuse it and leave the entered number.
         const QVariant &number = arguments.first();

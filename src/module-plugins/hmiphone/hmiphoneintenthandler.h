@@ -2,6 +2,8 @@
 
 #include <taldris/hmiintenthandler.h>
 
+#include <QPointer>
+
 namespace HmiPhone {
 
 class HmiPhoneController;
@@ -23,7 +25,8 @@ private slots:
     void bluetoothDeviceConnectionChanged(bool connected);
 
 private:
-    HmiPhoneController *m_controller;
+    // QML can delete the controller ("_hmiphoneController" inherits deleteLater()).
+    QPointer<HmiPhoneController> m_controller;
 };
 
 } // namespace HmiPhone

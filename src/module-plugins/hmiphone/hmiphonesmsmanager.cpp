@@ -2,6 +2,7 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphoneintegration.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 #include "phone_cmp.h"
@@ -142,6 +143,10 @@ void HmiPhoneSmsManager::handlePhnSmsRequestInbox()
 void HmiPhoneSmsManager::smsHandlePhoneDeclinedAccess()
 {
     m_popupManager->hideMessageWaitingForResponseFromPhone();
+    if (!m_controller) {
+        qCWarning(hmiphone) << "HmiPhoneSmsManager: the controller is gone, no text messages shown";
+        return;
+    }
     m_controller->showTextMessages();
 }
 

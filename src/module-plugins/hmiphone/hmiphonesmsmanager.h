@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QObject>
+#include <QPointer>
 
 namespace Quorvel {
 class HmiTransition;
@@ -53,7 +54,7 @@ private:
     Quorvel::IntSignalTransition *m_downloadFailedTransition = nullptr;
     HmiPhonePopupManager *m_popupManager = nullptr;
     Mavrosk::PhoneSource *m_phoneSource = nullptr;
-    HmiPhoneController *m_controller = nullptr;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
     Quorvel::HmiTransition *m_retryTransition = nullptr;
     Quorvel::HmiTransition *m_cancelTransition = nullptr;
     int m_retryCount = 0;

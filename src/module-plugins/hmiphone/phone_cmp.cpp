@@ -3,6 +3,7 @@
 #include "dialkeypadstate.h"
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphonesmsmanager.h"
 #include "hmiphoneviews.h"
@@ -42,7 +43,7 @@ bool isEmergencyStatus(int emergencyCallStatus)
 // Call states 3 to 5 are a call being set up or in progress; 0 to 2 are no call.
 bool isCallStatus(int status)
 {
-    return status >= 3 && status <= 5;
+    return status > CallStatus::LastWithoutCall && status <= CallStatus::LastCallInProgress;
 }
 
 } // namespace
@@ -75,7 +76,7 @@ Phone_Cmp::Phone_Cmp(HmiPhoneIntegration *integration, HmiPhoneController *contr
     m_addPhoneState = Quorvel::HmiViewState::createDummyViewState(QStringLiteral("HmiPhone_Limbo"),
                                                                   this, -1, false);
     connect(m_addPhoneState, &QAbstractState::entered, this,
-            Taldris::IntentActionRequest(70, nullptr));
+            Taldris::IntentActionRequest(IntentAction::NoPhoneConnected, nullptr));
 
     m_phoneMenuState
             = new PhoneMenuState(Views::PhoneMenu, QStringLiteral("PhoneMenuViewState"), this);
@@ -191,7 +192,9 @@ void Phone_Cmp::closeCallInProgressIfNeeded(QEvent *event)
 {
     Q_UNUSED(event)
     // Read as unsigned: a negative status is no valid "no call" value.
-    if (m_phoneSource && static_cast<unsigned int>(m_phoneSource->status()) <= 2u)
+    if (m_phoneSource
+        && static_cast<unsigned int>(m_phoneSource->status())
+                <= static_cast<unsigned int>(CallStatus::LastWithoutCall))
         m_callEndedTransition->setAllowTransition(true);
 }
 

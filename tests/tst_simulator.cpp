@@ -1,0 +1,142 @@
+// The simulator as a tester runs it: a scenario file in, the trace, the closing line and the exit
+// code out. A scenario is read and checked whole before anything runs.
+
+#include <QProcess>
+#include <QTemporaryDir>
+#include <QtTest>
+
+class SimulatorTest : public QObject
+{
+    Q_OBJECT
+private slots:
+    void scenarioFile_data();
+    void scenarioFile();
+
+private:
+    QTemporaryDir m_dir;
+};
+
+void SimulatorTest::scenarioFile_data()
+{
+    QTest::addColumn<QByteArray>("scenario");
+    QTest::addColumn<int>("exitCode");
+    QTest::addColumn<QString>("message"); // a line of stderr contains it
+
+    // Refused before anything runs: exit 2, the line named. Line 1 of each scenario is a valid
+    // step that would show a view if it ran.
+    const QByteArray open = "{\"open\": \"phone\"}\n";
+    const struct
+    {
+        const char *tag;
+        QByteArray line;
+        const char *message;
+    } refused[] = {
+            {"not JSON", "{\"open\": ", ":2: not JSON"},
+            {"not an object", "[1, 2]", ":2: a step is a JSON object"},
+            {"unknown step", "{\"jump\": 1}", ":2: unknown step"},
+            {"two steps in one", "{\"back\": 1, \"advance\": 5}", ":2: a step names one thing"},
+            {"unknown field", "{\"back\": 1, \"times\": 2}",
+             ":2: \"back\" takes no field \"times\""},
+            {"back as a string", "{\"back\": \"x\"}", ":2: \"back\" must be a number"},
+            {"back of zero", "{\"back\": 0}", ":2: \"back\" must be from 1 to 1000"},
+            {"start as a string", "{\"start\": \"yes\"}", ":2: \"start\" must be true or false"},
+            {"key not whole", "{\"key\": 7.6, \"kind\": 1}", ":2: \"key\" must be a whole number"},
+            {"key without kind", "{\"key\": 12}", ":2: \"key\" needs a \"kind\""},
+            {"intent out of range", "{\"intent\": 1e12}", ":2: \"intent\" must be from"},
+            {"args not an array", "{\"call\": \"endCall\", \"args\": 1}",
+             ":2: \"args\" must be an array"},
+            {"advance past a year", "{\"advance\": 9.2e18}",
+             ":2: \"advance\" must be from 0 to 31536000000"},
+            {"advance of 1e300", "{\"advance\": 1e300}", ":2: \"advance\" must be from 0"},
+            {"advance negative", "{\"advance\": -1}", ":2: \"advance\" must be from 0"},
+            {"open elsewhere", "{\"open\": \"radio\"}",
+             ":2: the menu bar opens phone, home or settings"},
+            {"NUL byte", QByteArray("{\"back\": 1}\0 {\"back\": 1}", 25),
+             ":2: a NUL byte at column 12"},
+            {"invalid UTF-8", "{\"post\": \"\xff\xfe\"}", ":2: not UTF-8 text"},
+            {"int property given a string", "{\"set\": \"phone.status\", \"value\": \"7\"}",
+             ":2: phone.status: must be a whole number"},
+            {"int property given a fraction", "{\"set\": \"phone.status\", \"value\": 7.5}",
+             ":2: phone.status: must be a whole number"},
+            {"int property out of range", "{\"set\": \"phone.status\", \"value\": 2147483648}",
+             ":2: phone.status: must be a whole number"},
+            {"bool property given a number", "{\"set\": \"phone.incomingCall\", \"value\": 1}",
+             ":2: phone.incomingCall: must be true or false"},
+            {"unknown source", "{\"set\": \"radio.band\", \"value\": 1}",
+             ":2: unknown value radio.band"},
+            {"unknown property", "{\"set\": \"phone.colour\", \"value\": 1}",
+             ":2: phone has no property colour"},
+            {"read-only controller property",
+             "{\"set\": \"controller.isEmptyNumber\", \"value\": true}",
+             ":2: controller.isEmptyNumber cannot be written"},
+            {"unknown host setting", "{\"set\": \"host.volume\", \"value\": 1}",
+             ":2: unknown host setting volume"},
+            {"status bar chosen late", "{\"set\": \"host.statusBar\", \"value\": false}",
+             ":2: host.statusBar is chosen before the module runs"},
+            {"unknown signal", "{\"emit\": \"phone.ringing\"}", ":2: phone has no signal ringing"},
+            {"signal argument of a wrong type",
+             "{\"emit\": \"key.keyEvent\", \"args\": [12, \"short\"]}",
+             ":2: argument 2 of key.keyEvent: must be a whole number"},
+            {"unknown slot", "{\"call\": \"answer\"}", ":2: the controller has no slot answer"},
+            {"slot with too many arguments", "{\"call\": \"endCall\", \"args\": [1]}",
+             ":2: slot endCall takes no 1 argument(s)"},
+            {"unknown model", "{\"model\": \"phone.recentCalls\", \"length\": 3}",
+             ":2: unknown list model phone.recentCalls"},
+            {"row that is no object", "{\"model\": \"phone.phoneBook\", \"rows\": [1]}",
+             ":2: every row of \"rows\" is an object"},
+            {"unknown check", "{\"expect\": {\"screen\": \"PhoneMenu\"}}",
+             ":2: unknown check \"screen\""},
+            {"unknown value checked", "{\"expect\": {\"phone.colour\": 1}}",
+             ":2: phone has no property colour"},
+            {"empty expectation", "{\"expect\": {}}", ":2: an expectation is a non-empty object"},
+    };
+    for (const auto &row : refused)
+        QTest::newRow(row.tag) << (open + row.line + "\n") << 2 << QString::fromUtf8(row.message);
+    QTest::newRow("every bad line named")
+            << QByteArray("{\"back\": \"x\"}\n{\"open\": \"phone\"}\n{\"key\": 1.5, \"kind\": 1}\n")
+            << 2 << QStringLiteral("2 of 3 lines cannot run; nothing was run");
+
+    // Run: the closing line counts checks and failures.
+    QTest::newRow("all checks pass")
+            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n") << 0
+            << QStringLiteral(": all 2 checks passed");
+    QTest::newRow("one of three checks fails")
+            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
+                          "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
+            << 1 << QStringLiteral(": 1 of 3 checks failed (line 2)");
+    QTest::newRow("a slot argument Qt cannot convert")
+            << QByteArray("{\"call\": \"fixStatusAlert\", \"args\": [[1]]}\n") << 1
+            << QStringLiteral(": 1 step could not be applied (line 1)");
+    QTest::newRow("a year at a time, twice")
+            << QByteArray("{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
+                          "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
+            << 1 << QStringLiteral("63072000.000  check");
+}
+
+void SimulatorTest::scenarioFile()
+{
+    QFETCH(QByteArray, scenario);
+    QFETCH(int, exitCode);
+    QFETCH(QString, message);
+
+    QVERIFY(m_dir.isValid());
+    const QString path = m_dir.filePath(QStringLiteral("scenario.jsonl"));
+    QFile file(path);
+    QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
+    file.write(scenario);
+    file.close();
+
+    QProcess simulator;
+    simulator.start(QStringLiteral(HMIPHONE_SIM_FILE),
+                    {QStringLiteral("--log"), QStringLiteral("none"), path});
+    QVERIFY(simulator.waitForFinished(30000));
+    const QString out = QString::fromUtf8(simulator.readAllStandardOutput());
+    const QString err = QString::fromUtf8(simulator.readAllStandardError());
+    QVERIFY2(simulator.exitCode() == exitCode, qPrintable(out + err));
+    QVERIFY2((out + err).contains(message), qPrintable(out + err));
+    if (exitCode == 2)
+        QVERIFY2(!out.contains(QLatin1String(" view ")), qPrintable(out));
+}
+
+QTEST_GUILESS_MAIN(SimulatorTest)
+#include "tst_simulator.moc"

@@ -1,0 +1,164 @@
+#include "headunitwindow.h"
+
+#include "headunitscreen.h"
+#include "outputwriter.h"
+
+#include <QDebug>
+#include <QDir>
+#include <QGuiApplication>
+#include <QQmlComponent>
+#include <QQmlContext>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickRenderControl>
+#include <QQuickView>
+#include <QQuickWindow>
+#include <QSGRendererInterface>
+#include <QStringListModel>
+
+// Resources of a static library are registered by hand, outside any namespace.
+static void initWindowResources()
+{
+    Q_INIT_RESOURCE(window);
+}
+
+namespace Simulator {
+
+namespace {
+
+constexpr int TraceLength = 2000; // lines kept in the window's trace
+const QSize DisplaySize(1280, 720);
+
+const char *const ExportedNames[] = {"_hmiphone", "_hmiphoneController"};
+
+} // namespace
+
+QCoreApplication *HeadUnitWindow::createApplication(int &argc, char **argv, Mode mode)
+{
+    if (mode == OffScreen)
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    // Flat pages need no graphics stack; the software renderer draws the same on every machine.
+    QQuickWindow::setSceneGraphBackend(QSGRendererInterface::Software);
+    return new QGuiApplication(argc, argv);
+}
+
+HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
+                               VirtualEventDispatcher *clock, ScenarioPlayer::PlayStep playStep,
+                               Mode mode, QObject *parent)
+    : QObject(parent)
+    , m_screen(new HeadUnitScreen(clock, this))
+    , m_player(new ScenarioPlayer(std::move(playStep), mode == OnScreen, this))
+    , m_trace(new QStringListModel(this))
+{
+    initWindowResources();
+    if (output)
+        connect(output, &OutputWriter::written, this, &HeadUnitWindow::appendTrace);
+    // The display reads the screen again after every step: values of the bridge change what the
+    // pages show without a journal entry.
+    connect(m_player, &ScenarioPlayer::played, m_screen, &HeadUnitScreen::refresh);
+
+    QQmlContext *context = engine->rootContext();
+    // Until the module exports its objects, the window's chrome sees them as null.
+    for (const char *name : ExportedNames) {
+        if (!context->contextProperty(QLatin1String(name)).isValid())
+            context->setContextProperty(QLatin1String(name),
+                                        QVariant::fromValue<QObject *>(nullptr));
+    }
+    context->setContextProperty(QStringLiteral("_headUnit"), m_screen);
+    context->setContextProperty(QStringLiteral("_scenario"), m_player);
+    context->setContextProperty(QStringLiteral("_trace"), m_trace);
+
+    const QUrl main(QStringLiteral("qrc:/hmiphone-sim/Main.qml"));
+    if (mode == OnScreen) {
+        auto *view = new QQuickView(engine, nullptr);
+        view->setTitle(QStringLiteral("hmiphone-sim"));
+        view->setResizeMode(QQuickView::SizeRootObjectToView);
+        view->setSource(main);
+        view->resize(DisplaySize);
+        m_window = view;
+        m_root = view->rootObject();
+    } else {
+        m_renderControl = new QQuickRenderControl(this);
+        m_window = new QQuickWindow(m_renderControl);
+        m_window->resize(DisplaySize);
+        QQmlComponent component(engine, main);
+        m_root = qobject_cast<QQuickItem *>(
+                component.createWithInitialProperties({{QStringLiteral("displayOnly"), true}}));
+        if (m_root) {
+            m_root->setParentItem(m_window->contentItem());
+            m_root->setSize(DisplaySize);
+        } else {
+            qWarning().noquote() << component.errorString();
+        }
+        m_renderControl->initialize(nullptr);
+    }
+    m_screen->refresh();
+}
+
+HeadUnitWindow::~HeadUnitWindow()
+{
+    delete m_root;
+    delete m_window;
+}
+
+void HeadUnitWindow::setScenario(const QList<ScenarioStep> &steps)
+{
+    m_player->setSteps(steps);
+}
+
+void HeadUnitWindow::show()
+{
+    m_window->show();
+}
+
+QImage HeadUnitWindow::grab()
+{
+    if (!m_renderControl)
+        return m_window->grabWindow();
+    m_renderControl->polishItems();
+    m_renderControl->sync();
+    return m_renderControl->grab();
+}
+
+void HeadUnitWindow::appendTrace(const QString &line)
+{
+    const int row = m_trace->rowCount();
+    if (row >= TraceLength)
+        m_trace->removeRows(0, row - TraceLength + 1);
+    m_trace->insertRow(m_trace->rowCount());
+    m_trace->setData(m_trace->index(m_trace->rowCount() - 1), line);
+}
+
+int HeadUnitWindow::writeScreenshots(const QString &directory, QString *error)
+{
+    if (!QDir().mkpath(directory)) {
+        *error = QStringLiteral("cannot create %1").arg(directory);
+        return -1;
+    }
+    QImage last = grab();
+    int written = 0;
+    QString failed;
+    auto connection = connect(m_player, &ScenarioPlayer::played, this, [&](int line) {
+        if (!failed.isEmpty())
+            return;
+        const QImage picture = grab();
+        if (picture == last)
+            return;
+        last = picture;
+        const QString file = QDir(directory).filePath(
+                QStringLiteral("%1.png").arg(line, 3, 10, QLatin1Char('0')));
+        if (!picture.save(file))
+            failed = QStringLiteral("cannot write %1").arg(file);
+        else
+            ++written;
+    });
+    m_player->playAll();
+    disconnect(connection);
+    if (!failed.isEmpty()) {
+        *error = failed;
+        return -1;
+    }
+    return written;
+}
+
+} // namespace Simulator

@@ -1,0 +1,108 @@
+import QtQuick 2.15
+
+// Beside the display: the car's keys (a tap is a short press, the lower half of a key a long
+// one), the host's menu bar, and the phone's side. Each press is played as a scenario step.
+Rectangle {
+    id: panels
+    color: "#151a20"
+    readonly property var phone: _hmiphoneController ? _hmiphoneController.phoneSource : null
+    readonly property int battery: phone ? phone.deviceBatteryLevel : 0
+
+    component Heading: Text {
+        color: Theme.dim
+        font.family: Theme.font
+        font.pixelSize: 20
+    }
+    component Key: Column {
+        property int code
+        property alias text: shortPress.text
+        spacing: 2
+        Button {
+            id: shortPress
+            objectName: "key:" + parent.code
+            width: 140
+            height: 52
+            fontSize: 20
+            onClicked: _scenario.pressKey(parent.code, false)
+        }
+        Button {
+            objectName: "longkey:" + parent.code
+            width: 140
+            height: 30
+            fontSize: 14
+            text: "long"
+            onClicked: _scenario.pressKey(parent.code, true)
+        }
+    }
+    component Action: Button {
+        property string step
+        width: 190
+        height: 52
+        fontSize: 20
+        onClicked: _scenario.input(step)
+    }
+
+    Column {
+        x: 20
+        y: 16
+        spacing: 10
+
+        Heading { text: "Car keys" }
+        Grid {
+            columns: 4
+            spacing: 10
+            Key { code: 12; text: "Phone" }
+            Key { code: 49; text: "Send" }
+            Key { code: 50; text: "End" }
+            Key { code: 77; text: "Accept/\u25C0" }
+            Key { code: 78; text: "Reject/\u25B6" }
+            Key { code: 79; text: "Send 2" }
+            Key { code: 80; text: "End 2" }
+            Key { code: 90; text: "Wheel \u25BC" }
+            Key { code: 91; text: "Wheel \u25B2" }
+        }
+
+        Heading { text: "Menu bar" }
+        Row {
+            spacing: 10
+            Action { width: 140; text: "Home"; step: '{"open": "home"}' }
+            Action { width: 140; text: "Phone"; step: '{"open": "phone"}' }
+            Action { width: 140; text: "Settings"; step: '{"open": "settings"}' }
+            Action { width: 140; text: "Back"; step: '{"back": 1}' }
+        }
+
+        Heading { text: "The phone" }
+        Grid {
+            columns: 3
+            spacing: 10
+            Action {
+                objectName: "phone:ring"
+                text: "Ring"
+                step: '{"set": "phone.incomingCall", "value": true}'
+            }
+            Action {
+                objectName: "phone:hangUp"
+                text: "Caller hangs up"
+                step: '[{"set": "phone.incomingCall", "value": false},'
+                      + '{"set": "phone.callConnected", "value": false},'
+                      + '{"set": "phone.status", "value": 0}]'
+            }
+            Action {
+                text: "Text message"
+                step: '[{"set": "phone.textMessageBody", "value": "See you at eight?"},'
+                      + '{"emit": "phone.newTextMessageAlert", "args": []}]'
+            }
+            Action { text: "Connect"; step: '{"set": "bluetooth.deviceConnected", "value": true}' }
+            Action { text: "Disconnect"; step: '{"set": "bluetooth.deviceConnected", "value": false}' }
+            Action { text: "Link loss"; step: '{"emit": "phone.nonUserDeviceDisconnectReceived", "args": []}' }
+            Action {
+                text: "Battery \u2212"
+                step: '{"set": "phone.deviceBatteryLevel", "value": ' + Math.max(0, panels.battery - 1) + '}'
+            }
+            Action {
+                text: "Battery +"
+                step: '{"set": "phone.deviceBatteryLevel", "value": ' + Math.min(5, panels.battery + 1) + '}'
+            }
+        }
+    }
+}

@@ -1,0 +1,76 @@
+import QtQuick 2.15
+import "Views.js" as Views
+
+// The popups over the screen, stacked as the framework holds them: the top one of each region
+// in front with its buttons, the ones it covers behind it, dimmed.
+Item {
+    id: popupLayer
+    property var popups: []
+    property var controller
+
+    Rectangle {
+        anchors.fill: parent
+        color: "#000000"
+        opacity: popupLayer.popups.length > 0 ? 0.55 : 0
+    }
+
+    Repeater {
+        model: popupLayer.popups
+        Rectangle {
+            id: card
+            readonly property var popupActions: Views.actionsFor(modelData.name)
+            readonly property int stackDepth: popupLayer.popups.length - 1 - index
+            objectName: "popup:" + modelData.name
+            property string viewId: modelData.id
+            property bool isTop: modelData.top
+
+            width: 760
+            height: 340
+            x: (popupLayer.width - width) / 2 - stackDepth * 36
+            y: (popupLayer.height - height) / 2 - stackDepth * 36
+            radius: 16
+            color: Theme.surface
+            border.color: isTop ? Theme.accent : "#3a4754"
+            border.width: 2
+            opacity: isTop ? 1 : 0.6
+
+            Text {
+                anchors.horizontalCenter: parent.horizontalCenter
+                y: 56
+                width: parent.width - 64
+                horizontalAlignment: Text.AlignHCenter
+                wrapMode: Text.Wrap
+                text: Views.title(modelData.name)
+                color: Theme.text
+                font.family: Theme.font
+                font.pixelSize: 38
+            }
+            Text {
+                anchors.right: parent.right
+                anchors.bottom: parent.bottom
+                anchors.margins: 10
+                text: modelData.id + (card.isTop ? "" : "  (covered)")
+                color: Theme.dim
+                font.family: Theme.font
+                font.pixelSize: 16
+            }
+            Row {
+                anchors.horizontalCenter: parent.horizontalCenter
+                anchors.bottom: parent.bottom
+                anchors.bottomMargin: 48
+                spacing: 20
+                enabled: card.isTop
+                Repeater {
+                    model: card.popupActions
+                    Button {
+                        text: modelData[0]
+                        slot: modelData[1]
+                        tint: modelData[1].indexOf("accept") === 0 ? Theme.accept
+                              : modelData[1].indexOf("reject") === 0 ? Theme.reject : Theme.raised
+                        onClicked: Views.invoke(popupLayer.controller, modelData)
+                    }
+                }
+            }
+        }
+    }
+}
