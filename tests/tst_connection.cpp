@@ -26,7 +26,6 @@ link lost, app settings  | view SETTINGS.ZentroSingleAppSettings | $lost | inten
 link lost, other         | view SETTINGS.ZentroAllAppsSettingsMore | $lost |
 door open, call          | $call               | $door   | popup PhoneConnectionLost; dismiss PhoneSmsSendTextMessage
 door open, no call       |                     | $door   | popup UnableToConnect; dismiss PhoneSmsSendTextMessage
-reconnect failed         | $call               | phone!deviceReconnectFailReceived | popup UnableToConnect
 reconnected              | bluetooth.deviceConnected=false | bluetooth.deviceConnected=true | dismiss PhoneConnectionLost; dismiss UnableToConnect; intent 53()
 DTMF error, call         | $call               | phone!dtmfKeyPressNoResponseErrorReceived | popup DTMFKeyPressNoResponseErrorPopup
 DTMF error               |                     | phone!dtmfKeyPressNoResponseErrorReceived |
@@ -68,9 +67,7 @@ menu left, no bar        | nobar; phone.siriActive=true | controller!phoneMenuEx
 menu entered             | phone.phoneVoiceServiceActive=true | controller!phoneMenuEntered | hide $voiceMsg; dismiss $voice
 menu entered, no bar     | nobar; phone.siriActive=true | controller!phoneMenuEntered | dismiss $voice
 bar hides                | phone.siriActive=true | bar=0 | popup $voice
-bar shows, inactive      | bar=0               | bar=1 |
 
-contacts started         |                     | $contacts=2 | transient $pbInitiated
 contacts started again   | $contacts=1         | $contacts=2 | transient $pbInitiated
 contacts complete        | $contacts=2         | $contacts=1 | hide $pbInitiated; transient PhonebookDownloadComplete
 contacts complete, 2     | $contacts=2; context=2 | $contacts=1 | hide $pbInitiated; popup PhoneBookDownloadComplete

@@ -50,7 +50,7 @@ void SimulatorTest::scenarioFile_data()
             {"advance of 1e300", "{\"advance\": 1e300}", ":2: \"advance\" must be from 0"},
             {"advance negative", "{\"advance\": -1}", ":2: \"advance\" must be from 0"},
             {"open elsewhere", "{\"open\": \"radio\"}",
-             ":2: the menu bar opens phone, home or settings"},
+             ":2: the menu bar opens phone, home, settings or settings/<entry>"},
             {"NUL byte", QByteArray("{\"back\": 1}\0 {\"back\": 1}", 25),
              ":2: a NUL byte at column 12"},
             {"invalid UTF-8", "{\"post\": \"\xff\xfe\"}", ":2: not UTF-8 text"},

@@ -372,16 +372,21 @@ private slots:
     {
         QTest::addColumn<QString>("request");
         QTest::addColumn<QString>("activeView");
+        QTest::addColumn<QString>("otherState"); // a further state of that name
         // clang-format off
-        QTest::addRow("state name: the component chooses") << "PhoneRoot" << "Menu";
-        QTest::addRow("view identifier") << "T.Keypad" << "Keypad";
-        QTest::addRow("unknown: recorded only") << "T.Nowhere" << "Home";
+        QTest::addRow("state name: the component chooses") << "PhoneRoot" << "Menu" << "";
+        QTest::addRow("view identifier") << "T.Keypad" << "Keypad" << "";
+        QTest::addRow("view identifier wins over a state's name") << "T.Keypad" << "Keypad" << "T.Keypad";
+        QTest::addRow("unknown: recorded only") << "T.Nowhere" << "Home" << "";
         // clang-format on
     }
     void showView()
     {
         QFETCH(QString, request);
         QFETCH(QString, activeView);
+        QFETCH(QString, otherState);
+        if (!otherState.isEmpty())
+            new HmiState(otherState, StateMachine::instance()->screensState());
         Screens screens;
         screens.start();
         ViewController::instance()->showView(request, QVariant(), false, QVariant());

@@ -173,6 +173,11 @@ QString OutputWriter::details(const Output &output)
         return value.isValid() ? QStringLiteral("%1 %2").arg(field("name"), compactJson(value))
                                : field("name");
     }
+    if (kind == QLatin1String("menu-entry"))
+        return QStringLiteral("%1: %2 %3")
+                .arg(field("menu"), field("name"),
+                     f.value(QStringLiteral("enabled")).toBool() ? QStringLiteral("enabled")
+                                                                 : QStringLiteral("disabled"));
     if (kind == QLatin1String("log"))
         return QStringLiteral("[%1] %2").arg(field("level"), field("msg"));
     if (kind == QLatin1String("check"))

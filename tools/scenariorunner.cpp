@@ -7,6 +7,7 @@
 
 #include <brisken/datastore.h>
 #include <brisken/statusbarcontroller.h>
+#include <brisken/viewcontroller.h>
 #include <brisken/viewmanager.h>
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -14,6 +15,7 @@
 #include <mavrosk/multidplistmodel.h>
 #include <quorvel/hmievent.h>
 #include <quorvel/hmistate.h>
+#include <quorvel/hmiviewstate.h>
 #include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
 
@@ -258,8 +260,10 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
             m_host->openModule();
         else if (what == QLatin1String("home"))
             m_host->openHome();
-        else if (m_host->settings())
-            Quorvel::StateMachine::instance()->goToState(m_host->settings());
+        else if (what.startsWith(QLatin1String("settings/")))
+            return chooseSettingsEntry(what.section(QLatin1Char('/'), 1));
+        else
+            m_host->openSettings();
         return QString();
     }
     case ScenarioStep::Back:
@@ -286,6 +290,18 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
     default:
         return QString();
     }
+}
+
+QString ScenarioRunner::chooseSettingsEntry(const QString &entry)
+{
+    // The driver opens the settings menu (unless it is on screen) and taps the entry.
+    if (Brisken::ViewController::instance()->activeView() != m_host->settingsMenu()->targetView()) {
+        m_host->openSettings();
+        m_clock->runUntilIdle();
+    }
+    if (!m_host->chooseSettingsEntry(entry))
+        return QStringLiteral("the settings menu has no entry %1").arg(entry);
+    return QString();
 }
 
 void ScenarioRunner::report(int line, const QString &message)

@@ -70,6 +70,9 @@ private:
     QString apply(const ScenarioStep &step);
     QString writeValue(const QString &name, const QJsonValue &value);
     void report(int line, const QString &message);
+    // {"open": "settings/<entry>"}: the settings menu's entry, chosen as the driver would; empty
+    // or why it could not be.
+    QString chooseSettingsEntry(const QString &entry);
 
     Host::ModuleHost *m_host;
     QQmlEngine *m_engine;

@@ -19,7 +19,7 @@ struct ScenarioStep
         Call, // {"call": "acceptIncomingCall", "args": []}
         Intent, // {"intent": 1, "args": ["0123456789"]}
         Post, // {"post": "HmiPhone_RootStateRequest", "value": null}
-        Open, // {"open": "phone"} or {"open": "home"}
+        Open, // {"open": "phone"}, "home", "settings" or "settings/Phone" (a settings entry)
         Back, // {"back": 1}
         Model, // {"model": "phone.phoneBook", "length": 60} or "rows": [...]
         Advance, // {"advance": 3000}

@@ -22,7 +22,8 @@ public:
     void requestPopup(const QString &viewId, const QVariant &data = QVariant());
     // Closes the popup, on top or covered; the next one still open shows.
     void dismissPopup(const QString &viewId);
-    // Enters the state of that name, or the view state showing that view.
+    // Enters the view state showing that view; for an identifier that no view state shows, the
+    // state of that name (entered through its initial state). Anything else is only recorded.
     void showView(const QVariant &viewId, const QVariant &data = QVariant(), bool flag = false,
                   const QVariant &extra = QVariant());
     // Goes back `steps` views in the back stack of the views shown.

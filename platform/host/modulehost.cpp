@@ -1,10 +1,14 @@
 #include "modulehost.h"
 
+#include <brisken/hmiaction.h>
 #include <brisken/modulecontroller.h>
 #include <brisken/viewcontroller.h>
+#include <journal/journal.h>
 #include <quorvel/hmiviewstate.h>
 #include <quorvel/statemachine.h>
+#include <taldris/hmihostedsubmodule.h>
 #include <taldris/hmimoduleintegration.h>
+#include <taldris/hmisubmoduleprovider.h>
 #include <taldris/moduleinterface.h>
 
 #include <QCoreApplication>
@@ -13,6 +17,15 @@
 #include <QQmlEngine>
 
 namespace Host {
+
+namespace {
+
+const QString SettingsView = QStringLiteral("HOST.Settings");
+// The settings module as it names itself to the submodule provider, and the submodules it hosts.
+const QString SettingsModuleId = QStringLiteral("SETTINGS");
+const int PhoneSettingsSubmodule = 3;
+
+} // namespace
 
 void processUntilIdle()
 {
@@ -87,13 +100,63 @@ bool ModuleHost::setUp(const QString &moduleName, QQmlEngine *engine)
     Quorvel::HmiState *screens = machine->screensState();
     m_home = new Quorvel::HmiViewState(QStringLiteral("HOST.Home"), screens);
     m_moduleParent = new Quorvel::HmiState(QStringLiteral("HOST.Module"), screens);
-    m_settings = new Quorvel::HmiState(QStringLiteral("HOST.Settings"), screens);
+    m_settings = new Quorvel::HmiState(SettingsView, screens);
+    // The settings menu comes first: hosted submodules return to it.
+    m_settingsMenu = new Quorvel::HmiViewState(SettingsView, QStringLiteral("HOST.SettingsMenu"),
+                                               m_settings);
+    m_settings->setInitialHmiState(m_settingsMenu);
     screens->setInitialHmiState(m_home);
 
     m_moduleRoot = m_integration->createScreenStateSubTree(m_moduleParent);
     machine->installRootHierarchy(m_integration->moduleRootHierarchyTransitions(),
                                   m_integration->moduleRootHierarchyPopupStates());
+    hostSettingsSubmodule(PhoneSettingsSubmodule);
     return true;
+}
+
+void ModuleHost::hostSettingsSubmodule(int id)
+{
+    auto *provider = Taldris::HmiSubmoduleProvider::instance();
+    // Only a submodule offered now: a request kept for later would outlive this host's states.
+    Taldris::HmiHostedSubmodule *submodule = provider->hostedSubmodule(id);
+    if (!submodule || !provider->requestSubmodule(id, m_settings, SettingsModuleId, 0))
+        return;
+    Brisken::HmiAction *entry = submodule->subModuleEntryAction();
+    if (!entry)
+        return;
+    m_settingsEntries.append(entry);
+    recordSettingsEntry(entry);
+    connect(entry, &Brisken::HmiAction::enabledChanged, this,
+            [this, entry] { recordSettingsEntry(entry); });
+}
+
+void ModuleHost::recordSettingsEntry(const Brisken::HmiAction *entry)
+{
+    Platform::Journal::instance()->append(QStringLiteral("menu-entry"),
+                                          {{QStringLiteral("menu"), SettingsView},
+                                           {QStringLiteral("name"), entry->text()},
+                                           {QStringLiteral("enabled"), entry->isEnabled()}});
+}
+
+QList<Brisken::HmiAction *> ModuleHost::settingsEntries() const
+{
+    QList<Brisken::HmiAction *> entries;
+    for (const QPointer<Brisken::HmiAction> &entry : m_settingsEntries) {
+        if (entry)
+            entries.append(entry);
+    }
+    return entries;
+}
+
+bool ModuleHost::chooseSettingsEntry(const QString &name)
+{
+    for (Brisken::HmiAction *entry : settingsEntries()) {
+        if (entry->text() == name || entry->name() == name) {
+            entry->trigger();
+            return true;
+        }
+    }
+    return false;
 }
 
 void ModuleHost::start()
@@ -112,6 +175,12 @@ void ModuleHost::openHome()
 {
     if (m_home)
         Quorvel::StateMachine::instance()->goToState(m_home);
+}
+
+void ModuleHost::openSettings()
+{
+    if (m_settings)
+        Quorvel::StateMachine::instance()->goToState(m_settings);
 }
 
 } // namespace Host

@@ -282,16 +282,24 @@ QStringList StateMachine::backStack() const
 
 QAbstractState *StateMachine::findViewTarget(const QString &nameOrViewId) const
 {
-    if (NamedState *state = d->stateForName(nameOrViewId))
-        return state;
+    // A view request names a view: the view state showing it wins over a state of that name
+    // (the one named after its view first, as most are). Asked for by the name of another state
+    // (a component, a module's settings state), it enters that state, so that the state's
+    // initial state decides what is shown.
+    NamedState *named = d->stateForName(nameOrViewId);
+    auto shows = [&nameOrViewId](NamedState *state) {
+        auto *view = qobject_cast<HmiViewState *>(state);
+        return view && view->targetView() == nameOrViewId;
+    };
+    if (shows(named))
+        return named;
     for (const QVector<NamedState *> &states : qAsConst(d->names)) {
         for (NamedState *state : states) {
-            auto *view = qobject_cast<HmiViewState *>(state);
-            if (view && view->targetView() == nameOrViewId)
-                return view;
+            if (shows(state))
+                return state;
         }
     }
-    return nullptr;
+    return named;
 }
 
 void StateMachine::beginSelectTransitions(QEvent *event)

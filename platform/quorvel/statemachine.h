@@ -105,7 +105,7 @@ public:
     bool back(int steps = 1);
     // The view states in the back stack, by state name, bottom first.
     QStringList backStack() const;
-    // Finds a state by name, or the view state that shows the view `viewId`.
+    // Finds the view state that shows the view `nameOrViewId`, or else the state of that name.
     QAbstractState *findViewTarget(const QString &nameOrViewId) const;
 
 signals:

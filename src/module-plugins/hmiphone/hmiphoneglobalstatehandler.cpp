@@ -300,6 +300,7 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.event(Events::HmiPhone_AddPhoneRequest, phoneCmp).run(&H::addPhoneRequested).list(7);
     chart.signal(m_speechSource, &Mavrosk::SpeechSource::displayPairingPopup).voiceEvent()
             .run(Taldris::HmiIntentRequest(14, {ModuleName}, false, true, QVariant())).list(8);
+
     chart.event(Events::HmiPhone_EndCallRequest).run(&H::endCall).list(9);
 
     // The phone rings: two guarded transitions on the same change of "incomingCall" split the
@@ -513,8 +514,8 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     auto voiceOn = chart.change(phone, "phoneVoiceServiceActive", {false}, true)
             .parallelExclusive(2).list(105, L2);
     auto voiceOff = chart.change(phone, "phoneVoiceServiceActive", {true}, false).list(106, L2);
-    auto menuExited = chart.signal(m_controller, &HmiPhoneController::phoneMenuExited).list(108, L2);
-    auto menuEntered = chart.signal(m_controller, &HmiPhoneController::phoneMenuEntered).list(109, L2);
+    auto menuExited = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuExited).list(108, L2);
+    auto menuEntered = chart.signal(m_controller.data(), &HmiPhoneController::phoneMenuEntered).list(109, L2);
     const QString &voiceMessage = Transients::PhoneVoiceServiceActivatedTransientMsg;
     const QString &voicePopup = Views::PhoneVoiceServiceActivatedPopup;
     if (Brisken::StatusBarController *statusBar = statusBarController()) {

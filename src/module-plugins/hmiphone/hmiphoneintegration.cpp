@@ -4,6 +4,7 @@
 #include "hmiphoneglobalstatehandler.h"
 #include "hmiphoneintenthandler.h"
 #include "hmiphonepopupmanager.h"
+#include "hmiphonesettingshostedsubmodule.h"
 #include "phone_cmp.h"
 #include "phonemenustate.h"
 
@@ -128,6 +129,9 @@ Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiSta
     if (rootComponent)
         Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(0, rootComponent, moduleId(),
                                                                     2);
+    // The phone's pages in the settings module.
+    auto *settingsSubmodule = new HmiPhoneSettingsHostedSubmodule(m_controller, this);
+    Taldris::HmiSubmoduleProvider::instance()->registerHostedSubmodule(3, settingsSubmodule);
     return rootComponent;
 }
 

@@ -1,0 +1,58 @@
+#include "hmiphonesettingshostedsubmodule.h"
+
+#include "hmiphonesettingsstate.h"
+
+#include <brisken/hmiaction.h>
+#include <mavrosk/projectionsource.h>
+#include <taldris/intentactionrequest.h>
+
+namespace HmiPhone {
+
+namespace {
+
+// The settings-menu entry's action type and the intent action that opens the phone settings.
+const int SettingsEntryType = 3;
+const int PhoneSettingsAction = 7;
+
+} // namespace
+
+HmiPhoneSettingsHostedSubmodule::HmiPhoneSettingsHostedSubmodule(HmiPhoneController *controller,
+                                                                 QObject *parent)
+    : Taldris::HmiHostedSubmodule(parent)
+    , m_controller(controller)
+{ }
+
+Brisken::HmiAction *HmiPhoneSettingsHostedSubmodule::subModuleEntryAction()
+{
+    auto *action = new Brisken::HmiAction(hmiActionNameTr("Phone"),
+                                          QStringLiteral("settings/icon_phone"), SettingsEntryType,
+                                          this);
+    action->setTranslationContext(QStringLiteral("HmiPhone::HmiPhoneSettingsHostedSubmodule"));
+    connect(action, &Brisken::HmiAction::triggered, action,
+            Taldris::IntentActionRequest(PhoneSettingsAction, nullptr));
+    action->enabledBinding(Mavrosk::ProjectionSource::instance(),
+                           &Mavrosk::ProjectionSource::projectionDIONotActive);
+    return action;
+}
+
+QString HmiPhoneSettingsHostedSubmodule::moduleIdentifier() const
+{
+    return QStringLiteral("PHONE");
+}
+
+QString HmiPhoneSettingsHostedSubmodule::submoduleName() const
+{
+    return QStringLiteral("Phone settings submodule.");
+}
+
+QString HmiPhoneSettingsHostedSubmodule::viewDescriptorFile() const
+{
+    return QStringLiteral("plugins/hmiphone/settings-view-descriptor.json");
+}
+
+Quorvel::HmiState *HmiPhoneSettingsHostedSubmodule::createStateHierarchy(Quorvel::HmiState *parent)
+{
+    return new HmiPhoneSettingsState(m_controller, parent);
+}
+
+} // namespace HmiPhone
