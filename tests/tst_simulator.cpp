@@ -104,9 +104,10 @@ void SimulatorTest::scenarioFile_data()
             << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
             << 1 << QStringLiteral(": 1 of 3 checks failed (line 2)");
-    QTest::newRow("a slot argument Qt cannot convert")
-            << QByteArray("{\"call\": \"fixStatusAlert\", \"args\": [[1]]}\n") << 1
-            << QStringLiteral(": 1 step could not be applied (line 1)");
+    QTest::newRow("a call after QML deleted the controller")
+            << QByteArray("{\"call\": \"deleteLater\"}\n{\"intent\": 1, \"args\": [\"0123\"]}\n"
+                          "{\"call\": \"endCall\"}\n")
+            << 1 << QStringLiteral(": 1 step could not be applied (line 3)");
     QTest::newRow("a year at a time, twice")
             << QByteArray("{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")

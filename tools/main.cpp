@@ -2,7 +2,9 @@
 // phone's side from a scenario and writes what the HMI would show and what the module asks of
 // the phone, on a virtual clock.
 
+#include "invariants.h"
 #include "outputwriter.h"
+#include "randomsoak.h"
 #include "scenarioreader.h"
 #include "scenariorunner.h"
 #include "scenariostep.h"
@@ -16,9 +18,11 @@
 #include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QDir>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QFileInfo>
 #include <QQmlEngine>
+#include <QTemporaryFile>
 #include <QTextStream>
 
 #include <algorithm>
@@ -94,10 +98,64 @@ void printError(const QString &message)
     std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
 }
 
+// Plays random steps until one violates an invariant; the scenario so far goes to the file
+// asked for, or beside the program's working directory when a violation needs it.
+int runSoak(Simulator::ScenarioRunner *runner, Host::ModuleHost *host, quint32 seed, qint64 steps,
+            const QString &scenarioFile)
+{
+    QTemporaryFile temporary;
+    QFile named(scenarioFile);
+    QFile *file = &named;
+    if (scenarioFile.isEmpty()) {
+        file = &temporary;
+        if (!temporary.open()) {
+            printError(QStringLiteral("cannot write a temporary file"));
+            return CannotRun;
+        }
+    } else if (!named.open(QIODevice::WriteOnly | QIODevice::Truncate)) {
+        printError(QStringLiteral("cannot write %1: %2").arg(scenarioFile, named.errorString()));
+        return CannotRun;
+    }
+
+    Simulator::Invariants invariants(host);
+    Simulator::RandomSoak soak(runner, &invariants, seed);
+    soak.setScenarioFile(file);
+    QElapsedTimer elapsed;
+    elapsed.start();
+    const bool held = soak.run(steps);
+    file->flush();
+    if (held) {
+        std::printf("hmiphone-sim: seed %u: %lld steps, every invariant held (%.1f s)\n", seed,
+                    soak.stepsPlayed(), double(elapsed.elapsed()) / 1000.0);
+        return Passed;
+    }
+
+    QString saved = scenarioFile;
+    if (saved.isEmpty()) {
+        saved = QStringLiteral("hmiphone-soak-%1.jsonl").arg(seed);
+        QFile::remove(saved);
+        if (!temporary.copy(saved))
+            saved = temporary.fileName();
+    }
+    printError(QStringLiteral("seed %1, step %2: invariant violated: %3")
+                       .arg(seed)
+                       .arg(soak.stepsPlayed())
+                       .arg(soak.violation()));
+    printError(QStringLiteral("the last steps:"));
+    for (const QString &step : soak.recentSteps())
+        std::fprintf(stderr, "  %s\n", step.toUtf8().constData());
+    printError(QStringLiteral("the scenario so far: %1 (replay: hmiphone-sim --check-invariants "
+                              "%1)")
+                       .arg(saved));
+    return ChecksFailed;
+}
+
 } // namespace
 
 int main(int argc, char *argv[])
 {
+    // The same steps give the same run: no hash order may differ between two runs.
+    qSetGlobalQHashSeed(0);
     const Display display = displayOf(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
     std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
@@ -159,15 +217,41 @@ int main(int argc, char *argv[])
                            "of the display to the directory after each step that changes it, "
                            "named by the step's line."),
             QStringLiteral("directory"));
+    const QCommandLineOption randomOption(
+            QStringLiteral("random"),
+            QStringLiteral("Play random steps from this seed instead of a scenario, checking the "
+                           "invariants after every step; exits 1 on the first violation."),
+            QStringLiteral("seed"));
+    const QCommandLineOption stepsOption(QStringLiteral("steps"),
+                                         QStringLiteral("Number of random steps (default: 10000)."),
+                                         QStringLiteral("count"), QStringLiteral("10000"));
+    const QCommandLineOption writeScenarioOption(
+            QStringLiteral("write-scenario"),
+            QStringLiteral("With --random: write the steps played to this scenario file."),
+            QStringLiteral("file"));
+    const QCommandLineOption invariantsOption(
+            QStringLiteral("check-invariants"),
+            QStringLiteral("Check the soak's invariants after every step of the scenario."));
     parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
-                       windowOption, screenshotsOption});
+                       windowOption, screenshotsOption, randomOption, stepsOption,
+                       writeScenarioOption, invariantsOption});
     parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
+    const bool random = parser.isSet(randomOption);
     const QStringList positional = parser.positionalArguments();
-    if (positional.size() > 1
-        || (positional.isEmpty() && !interactive && display != Display::Window)) {
-        printError(QStringLiteral("give one scenario file, or --interactive"));
+    if (random ? !positional.isEmpty() || interactive || display != Display::None
+               : positional.size() > 1
+                        || (positional.isEmpty() && !interactive && display != Display::Window)) {
+        printError(QStringLiteral("give one scenario file, or --interactive, or --random SEED"));
+        return CannotRun;
+    }
+    bool seedOk = false;
+    bool stepsOk = false;
+    const quint32 seed = parser.value(randomOption).toUInt(&seedOk);
+    const qint64 randomSteps = parser.value(stepsOption).toLongLong(&stepsOk);
+    if (random && (!seedOk || !stepsOk || randomSteps < 0)) {
+        printError(QStringLiteral("--random takes a seed from 0 to 4294967295, --steps a count"));
         return CannotRun;
     }
     if (display != Display::None && (interactive || positional.value(0) == QLatin1String("-"))) {
@@ -179,7 +263,9 @@ int main(int argc, char *argv[])
         printError(QStringLiteral("--phone is scripted or simulated"));
         return CannotRun;
     }
-    const int level = logLevel(parser.value(logOption));
+    // A soak writes only what went wrong: the module's log lines are not even formatted.
+    const int level = logLevel(random && !parser.isSet(logOption) ? QStringLiteral("none")
+                                                                  : parser.value(logOption));
     if (level < 0) {
         printError(QStringLiteral("--log is debug, info, warning, critical or none"));
         return CannotRun;
@@ -195,7 +281,7 @@ int main(int argc, char *argv[])
             return CannotRun;
         }
         text = file.readAll();
-    } else if (!interactive && display == Display::None) {
+    } else if (!interactive && !random && display == Display::None) {
         QFile input;
         if (!input.open(stdin, QIODevice::ReadOnly)) {
             printError(QStringLiteral("cannot read stdin"));
@@ -208,6 +294,7 @@ int main(int argc, char *argv[])
     Simulator::OutputWriter output(clock,
                                    parser.isSet(jsonOption) ? Simulator::OutputWriter::Json
                                                             : Simulator::OutputWriter::Human);
+    output.setSilent(random);
     output.captureLog(ModuleLogCategory, level);
     createBridge();
 
@@ -245,6 +332,9 @@ int main(int argc, char *argv[])
         return CannotRun;
     }
 
+    if (random)
+        return runSoak(&runner, &host, seed, randomSteps, parser.value(writeScenarioOption));
+
     if (display != Display::None) {
         // Steps of the window's panels are checked as they come, like typed ones.
         auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
@@ -279,8 +369,22 @@ int main(int argc, char *argv[])
                                 .arg(parser.value(screenshotsOption)));
         }
     } else {
-        for (const Simulator::ScenarioStep &step : steps)
+        std::unique_ptr<Simulator::Invariants> invariants;
+        if (parser.isSet(invariantsOption))
+            invariants = std::make_unique<Simulator::Invariants>(&host);
+        for (const Simulator::ScenarioStep &step : steps) {
             runner.play(step);
+            const QString violation = invariants && step.isInput()
+                    ? invariants->check(runner.controller())
+                    : QString();
+            if (!violation.isEmpty()) {
+                printError(QStringLiteral("%1:%2: invariant violated: %3")
+                                   .arg(scenarioName)
+                                   .arg(step.line)
+                                   .arg(violation));
+                return ChecksFailed;
+            }
+        }
     }
     int refused = 0;
     if (interactive) {

@@ -111,6 +111,8 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 {
     Output output{m_clock ? m_clock->now() : 0, kind, fields};
     m_outputs.append(output);
+    if (m_silent)
+        return;
     const QString seconds = QString::number(double(output.time) / 1000.0, 'f', 3);
     const QString human
             = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
@@ -123,6 +125,8 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
 
 void OutputWriter::note(const QString &text)
 {
+    if (m_silent)
+        return;
     emit written(text);
     if (m_format != Human)
         return;
@@ -133,7 +137,8 @@ void OutputWriter::note(const QString &text)
 
 void OutputWriter::beginInput()
 {
-    m_inputStart = m_outputs.size();
+    m_outputs.clear();
+    m_inputStart = 0;
 }
 
 QString OutputWriter::details(const Output &output)
@@ -200,7 +205,8 @@ void OutputWriter::captureLog(const QString &category, int minimumLevel)
     m_logCategory = category;
     m_logLevel = minimumLevel;
     // The module's category writes only warnings by default; the simulator shows what was asked.
-    QString rules;
+    // Silent, the platform's own chatter goes too; its warnings still reach stderr.
+    QString rules = m_silent ? QStringLiteral("*.debug=false\n*.info=false\n") : QString();
     const char *levels[] = {"debug", "info", "warning", "critical"};
     for (int level = 0; level < 4; ++level)
         rules += QStringLiteral("%1.%2=%3\n")

@@ -40,12 +40,14 @@ public:
     ~OutputWriter() override;
 
     Format format() const { return m_format; }
+    // Silent: outputs are kept for the checks of the last input but written nowhere.
+    void setSilent(bool silent) { m_silent = silent; }
 
     void write(const QString &kind, const QVariantMap &fields = {});
     // A line for people only (scenario comments and the steps played): human format only.
     void note(const QString &text);
 
-    // Starts a new input step: outputs() from here on belong to it.
+    // Starts a new input step: outputs from here on belong to it; those of earlier inputs go.
     void beginInput();
     // The outputs written since the last input step began.
     QList<Output> outputsOfLastInput() const { return m_outputs.mid(m_inputStart); }
@@ -75,6 +77,7 @@ private:
     FILE *m_stream;
     QList<Output> m_outputs;
     int m_inputStart = 0;
+    bool m_silent = false;
     QString m_skipKind;
     QString m_logCategory;
     int m_logLevel = 0;

@@ -96,15 +96,17 @@ bool ScenarioRunner::ensureSetUp()
         m_setUpError = m_host->errorString();
         return false;
     }
+    // Held here: QML may delete it, and the context property would then point at nothing.
+    if (m_engine)
+        m_controller
+                = m_engine->rootContext()->contextProperty(ControllerProperty).value<QObject *>();
     emit moduleSetUp();
     return true;
 }
 
 QObject *ScenarioRunner::controller() const
 {
-    if (!m_engine || !m_setUp)
-        return nullptr;
-    return m_engine->rootContext()->contextProperty(ControllerProperty).value<QObject *>();
+    return m_controller;
 }
 
 void ScenarioRunner::start()

@@ -5,6 +5,7 @@
 
 #include <QList>
 #include <QObject>
+#include <QPointer>
 #include <QString>
 
 class QQmlEngine;
@@ -88,6 +89,7 @@ private:
     int m_stepErrors = 0;
     QList<int> m_failedLines;
     QString m_setUpError;
+    QPointer<QObject> m_controller;
 };
 
 } // namespace Simulator

@@ -27,6 +27,8 @@ constexpr int Dialling = 3;
 constexpr int OneCall = 7;
 constexpr int TwoCalls = 9;
 constexpr int TwoCallsJoined = 10;
+// Send status while a text message is on its way (2 sent, 0 and 1 failed, 3 network failure).
+constexpr int SendingMessage = 4;
 
 } // namespace
 
@@ -54,6 +56,9 @@ void SimulatedPhone::connectPhone()
     setPhone("messageAccessProfileStatus", true);
     setPhone("smsMessageAccessProfileAvailable", true);
     setPhone("messageNotificationEnabled", true);
+    // The phone has answered the request for message access, and its messages are in memory.
+    setPhone("smsPhoneDeclinedAccessStatus", true);
+    setPhone("messagesInMemoryStatus", true);
     setPhone("recentCallListStatus", 1);
     contactsDownloaded();
     setPhone("messagesInboxEmptyStatus", false);
@@ -136,6 +141,9 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
                || command == QLatin1String("retryMessageProfileAccess")) {
         downloadMessages();
     } else if (command == QLatin1String("initiateSendTextMessage")) {
+        // A status of its own while the message goes, so that every send reports its outcome
+        // as a change.
+        setPhone("sendMessageStatus", SendingMessage);
         QTimer::singleShot(SendMessageDelay, this, [] { setPhone("sendMessageStatus", 2); });
     }
 }

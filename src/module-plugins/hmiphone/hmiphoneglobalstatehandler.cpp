@@ -10,6 +10,7 @@
 #include "phone_cmp.h"
 #include "phonebook_cmp.h"
 #include "phonecall_cmp.h"
+#include "phonesms_cmp.h"
 #include "phonestatusalerts.h"
 
 #include <brisken/conditionalshowtransientorpopuprequest.h>
@@ -292,7 +293,17 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.event(Events::HmiPhone_CancelRedialRequest, popup(Views::Redial)).run(&H::cancelRedialRequest);
     chart.event(Events::HmiPhone_CallEndConfirmed, popup(Views::CallEnded)).run(&H::callEndConfirmed);
 
-    // [the five "NewTextMessageAlert2" rows; the "PhoneSmsTextMessagingOff" row]
+    // "NewTextMessageAlert2": hear it, stop, hide, or leave for the message or the replies.
+    chart.event(Events::HmiPhone_HearNewTextMessage, m_newTextMessageAlertPopup).run(&H::hearNewTextMessageAlert);
+    chart.event(Events::HmiPhone_StopHearNewTextMessage, m_newTextMessageAlertPopup).run(&H::stopHearNewTextMessageAlert);
+    chart.event(Events::HmiPhone_HideNewTextMessageAlert, m_newTextMessageAlertPopup).run(&H::hideNewTextMessageAlert);
+    chart.event(Events::HmiPhone_ViewNewTextMessage, m_newTextMessageAlertPopup)
+            .to(phoneCmp->phoneSmsViewState()).run(&H::viewNewTextMessageAlert);
+    chart.event(Events::HmiPhone_ReplyNewTextMessage, m_newTextMessageAlertPopup).to(phoneCmp->phoneSmsReplyViewState());
+
+    // "PhoneSmsTextMessagingOff" closes itself once messaging is turned on.
+    chart.change(phone, "messageNotificationEnabled", {false}, true, popup(Views::PhoneSmsTextMessagingOff))
+            .run(pm, &PM::hideTextMessagingOff);
 
     // --- Device and calls --------------------------------------------------------------------
 
@@ -429,7 +440,18 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     chart.property(phone, "deviceBatteryLevel").keep(m_batteryLevelTransition)
             .guard(&H::batteryLevelTransitionEventTest).run(pm, &PM::showBatteryLow).list(37);
     chart.event(Events::HmiPhone_ShowStatusBarAlertsRequest).to(phoneCmp->phoneStatusAlerts()).list(38);
-    // [the five text-message request and status rows]
+    // Opening the text messages: with messaging on, the phone's message access is checked;
+    // then the messages in memory open at once, the others after the status check.
+    chart.event(Events::HmiPhone_ShowSmsRequest).keep(m_smsNotificationDisabledTransition)
+            .guard(&H::smsMessageNotificationNotEnabledTest).run(pm, &PM::showTextMessagingOff).list(96);
+    chart.event(Events::HmiPhone_ShowSmsRequest).keep(m_smsNotificationEnabledTransition)
+            .guard(&H::smsMessageNotificationEnabledTest).run(&H::smsCheckPrerequisites).list(95);
+    chart.event(Events::HmiPhone_ShowSmsStatus).keep(m_smsInMemoryTransition)
+            .guard(&H::smsMessagesInMemoryTest).to(phoneCmp->phoneSmsCompositeState()).list(97);
+    chart.event(Events::HmiPhone_ShowSmsStatus).keep(m_smsNotInMemoryTransition)
+            .guard(&H::smsMessagesNotInMemoryTest).run(&H::smsCheckStatus).list(98);
+    chart.event(Events::HmiPhone_ShowSmsIphoneRequest).keep(m_smsIphoneTransition)
+            .to(phoneCmp->phoneSmsCompositeState()).list(112);
     // The call moves to the handset (stand-by) and back.
     chart.property(phone, "status").parallelExclusive(0).keep(m_standbyTransition)
             .guard(&H::standbyTransitionEventTest).run(pm, &PM::showTransferToPhone).list(40);
@@ -453,10 +475,50 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
             .run(pm, &PM::showUnableToConnect).run(pm, &PM::hideSendTextMessage).list(89);
     chart.signal(phone, &PhoneSource::deviceReconnectFailReceived)
             .run(pm, &PM::showUnableToConnect).list(75);
-    // [new message, listen and message details]
+    // New messages: the alert state picks the single or the multiple alert. Reading aloud: the
+    // new message once hear-it is pressed, a message of the list once its details are in.
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageAlert).keep(m_newTextMessageTransition)
+            .guard(&H::newTextMessageTest).run(&H::processNewTextMessageAlert).list(44);
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageAlert).keep(m_multipleNewTextMessagesTransition)
+            .guard(&H::multipleNewTextMessagesTest).run(&H::processNewTextMessageAlert).list(51);
+    chart.guardedSignal(phone, &PhoneSource::newTextMessageDetailsReady).keep(m_smsNewTextHearItTransition)
+            .guard(&H::smsNewTextHearitEventTest).run(&H::handleSmsNewTextHearitRequest).list(46);
+    chart.signal(phone, &PhoneSource::listenToMessageRequested).run(&H::handleListenMessageRequest).list(49);
+    chart.guardedSignal(phone, &PhoneSource::textMessageDetailsReady).keep(m_requestedMessageDetailsReadyTransition)
+            .guard(&H::requestedMessageDetailsReadyTest).run(&H::handleRequestedMessageDetailsReady).list(50);
+    chart.signal(phone, &PhoneSource::showMessageListRequested).voiceEvent()
+            .to(phoneCmp->phoneSmsCompositeState()).list(48);
+    chart.signal(phone, &PhoneSource::phoneSmsNewTextClusterHearItRequestReceived)
+            .run(&H::hearNewTextMessageAlert).list(86);
+    chart.signal(phone, &PhoneSource::phoneSmsNewTextClusterIgnoreRequestReceived)
+            .run(pm, &PM::newTextMessageAlert2Hide).list(87);
     // The root component dials, or asks for the roaming warning first.
     chart.event(Events::HmiPhone_MakeCallRequest).run(phoneCmp, &Phone_Cmp::makeCall).list(47);
-    // [reply and send; deviceConnectedChanged(bool)]
+    // Replying and sending: the replies, the reply chosen by voice, its confirmation, the send
+    // and its retries. The outcome is heard while the progress popup is up, and that popup
+    // closes when the connection changes.
+    chart.signal(phone, &PhoneSource::showReplyMessagesRequested)
+            .to(phoneCmp->phoneSmsReplyViewState()).run(pm, &PM::newTextMessageAlert2Hide).list(52);
+    chart.signal(phone, &PhoneSource::replyMessageLineNoChanged).run(&H::handleVRSendReplyMessage).list(54);
+    chart.event(Events::HmiPhoneSms_SendTextMessage, phoneCmp->phoneSmsReplyViewState())
+            .run(pm, &PM::showSendTextMessage).list(53);
+    chart.event(Events::HmiPhoneSms_InitiateSendTextMessage).run(&H::handleSendTextMessageRequest).list(56);
+    chart.signal(phone, &PhoneSource::sendMessageRequested).run(&H::handleSendTextMessageRequest).list(62);
+    chart.signal(phone, &PhoneSource::cancelSendMessageRequested).run(pm, &PM::hideSendTextMessage).list(63);
+    chart.event(Events::HmiPhoneSms_RetrySendTextMessage).run(&H::handleRetrySendTextMessage).list(61);
+    PopupState *sendProgress = popup(Views::PhoneSmsSendTextMessageProgress);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Sent, sendProgress)
+            .run(&H::handleSendTextMessageSuccess).list(57);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::Failed, sendProgress)
+            .run(&H::handleSendTextMessageFailure).list(58);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NetworkFailure, sendProgress)
+            .run(&H::handleSendTextMessageNetworkFailure).list(59);
+    chart.intSignal(phone, &PhoneSource::sendMessageStatusChanged, SendMessageStatus::NotSent, sendProgress)
+            .run(&H::handleSendTextMessageFailure).list(60);
+    chart.signal(phone, &PhoneSource::sendMessageNoResponseFromPhoneAlert)
+            .run(&H::handleSendMessageNoResponseFromPhone).list(113);
+    chart.signal(m_bluetoothSource, &Mavrosk::BluetoothSource::deviceConnectedChanged)
+            .dismisses(sendProgress).list(107);
 
     // --- Extended mode, errors and screens asked for from elsewhere --------------------------
 
@@ -538,7 +600,10 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     voiceOff.run(Brisken::DismissPopup(voicePopup));
     menuEntered.run(Brisken::DismissPopup(voicePopup));
     chart.event(Events::HmiPhone_ShowContactsRequest).to(phoneCmp->phoneBookCompositeState()).list(6, L2);
-    // [the two dismissing rows of "PhoneSmsSendTextMessage"]
+    // The send confirmation closes when a new message arrives or the message list is asked for.
+    PopupState *sendConfirmation = popup(Views::PhoneSmsSendTextMessage);
+    chart.signal(phone, &PhoneSource::newTextMessageAlert, sendConfirmation).dismisses(sendConfirmation);
+    chart.signal(phone, &PhoneSource::showMessageListRequested, sendConfirmation).dismisses(sendConfirmation);
 
     // clang-format on
 }
@@ -748,36 +813,6 @@ void HmiPhoneGlobalStateHandler::showPhoneDialingTransientMessage()
 void HmiPhoneGlobalStateHandler::hidePhoneDialingTransientMessage()
 {
     hideTransient(Transients::PhoneOutgoingDialing);
-}
-
-// --- Text-message alert bookkeeping ------------------------------------------------------------
-
-void HmiPhoneGlobalStateHandler::enableSingleMessageState()
-{
-    m_textMessageAlertState = 1;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnSingleMessageTimeout()
-{
-    // A state of 2 was set by the multiple-messages alert replacing this one: it stays.
-    if (m_textMessageAlertState == 1)
-        m_textMessageAlertState = 0;
-    if (m_phoneSource->hearItPressed()) {
-        m_phoneSource->requestTextMessagesInbox();
-        m_phoneSource->setHearItPressed(false);
-    }
-}
-
-void HmiPhoneGlobalStateHandler::enableMultipleMessagesState()
-{
-    m_textMessageAlertState = 2;
-}
-
-void HmiPhoneGlobalStateHandler::resetAlertStateOnMultipleMessagesTimeout()
-{
-    m_textMessageAlertState = 0;
-    if (m_controller)
-        m_controller->resetRecievedTextMessageCount();
 }
 
 } // namespace HmiPhone

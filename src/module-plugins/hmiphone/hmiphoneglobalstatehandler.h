@@ -99,11 +99,30 @@ private slots:
     void hidePhonePhonebookDownloadInitiatedTransientMessage();
     void showPhonebookDownloadCompleteTransientMessage();
 
-    // Text-message alert bookkeeping, wired to the alert popups
+    // Text messages: new-message alerts and their bookkeeping, reading aloud, replying and
+    // sending, and the checks before the message screens open
+    void processNewTextMessageAlert();
     void enableSingleMessageState();
     void resetAlertStateOnSingleMessageTimeout();
     void enableMultipleMessagesState();
     void resetAlertStateOnMultipleMessagesTimeout();
+    void hearNewTextMessageAlert();
+    void stopHearNewTextMessageAlert();
+    void hideNewTextMessageAlert();
+    void viewNewTextMessageAlert();
+    void handleSmsNewTextHearitRequest();
+    void handleListenMessageRequest();
+    void handleRequestedMessageDetailsReady();
+    void handleVRSendReplyMessage();
+    void handleSendTextMessageRequest();
+    void handleRetrySendTextMessage();
+    void handleSendTextMessageSuccess();
+    void handleSendTextMessageFailure();
+    void handleSendTextMessageNetworkFailure();
+    void handleSendMessageNoResponseFromPhone();
+    void smsCheckPrerequisites();
+    void smsCheckStatus();
+    void checkSmsStatus();
 
     // Link loss and reconnection
     void handleLinklossReconnectSuccessTransition();
@@ -174,6 +193,8 @@ private:
     void createPopupStates();
     void buildTransitionChart(GlobalChart &chart, Phone_Cmp *phoneCmp);
     Quorvel::PopupState *popup(const QString &view) const;
+
+    void handleNewTextMessagesReceived();
 
     void requestTransient(const QString &name);
     void hideTransient(const QString &name);

@@ -197,12 +197,13 @@ void HmiPhoneGlobalStateHandler::showPhoneDoorNoCallOpenLinklossTest(QEvent *)
 // exactly one of them, and the other is left at its default (blocked).
 void HmiPhoneGlobalStateHandler::newTextMessageTest(QEvent *)
 {
-    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == 0);
+    allowOnlyIf(m_newTextMessageTransition, m_textMessageAlertState == TextMessageAlert::None);
 }
 
 void HmiPhoneGlobalStateHandler::multipleNewTextMessagesTest(QEvent *)
 {
-    allowOnlyIf(m_multipleNewTextMessagesTransition, m_textMessageAlertState != 0);
+    allowOnlyIf(m_multipleNewTextMessagesTransition,
+                m_textMessageAlertState != TextMessageAlert::None);
 }
 
 void HmiPhoneGlobalStateHandler::requestedMessageDetailsReadyTest(QEvent *)

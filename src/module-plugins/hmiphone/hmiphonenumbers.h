@@ -83,4 +83,28 @@ inline constexpr int LongPress = 3;
 inline constexpr int LongPressRelease = 4;
 } // namespace KeyPress
 
+// The text-message alert on screen (the global handler's alert state).
+namespace TextMessageAlert {
+inline constexpr int None = 0;
+inline constexpr int Single = 1; // "NewTextMessageAlert2"
+inline constexpr int Multiple = 2; // "MultipleTextMessagesReceived"
+} // namespace TextMessageAlert
+
+// The phone's text-message download (PhoneSource::messagesDownloadingStatus()): 0 to 3 have not
+// failed.
+namespace MessagesDownload {
+inline constexpr int NotStarted = 0;
+inline constexpr int Running = 2;
+inline constexpr int Finished = 3;
+inline constexpr int Failed = 4;
+} // namespace MessagesDownload
+
+// The outcome of sending a text message (PhoneSource::sendMessageStatusChanged(int)).
+namespace SendMessageStatus {
+inline constexpr int NotSent = 0;
+inline constexpr int Failed = 1;
+inline constexpr int Sent = 2;
+inline constexpr int NetworkFailure = 3;
+} // namespace SendMessageStatus
+
 } // namespace HmiPhone
