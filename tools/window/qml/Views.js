@@ -15,7 +15,7 @@ function isPhoneView(viewId) {
 
 // "PhoneBookDownloadFailed" -> "Phone book download failed"
 function title(name) {
-    var words = name.replace(/^Phone(?=[A-Z])/, "").replace(/Popup$/, "")
+    var words = name.replace(/Popup$/, "")
                     .replace(/([a-z0-9])([A-Z])/g, "$1 $2").replace(/([A-Z]+)([A-Z][a-z])/g, "$1 $2");
     return words.charAt(0).toUpperCase() + words.slice(1).toLowerCase()
                 .replace(/\bsms\b/g, "text message").replace(/\bkova\b/g, "KOVA")
