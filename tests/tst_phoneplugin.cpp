@@ -8,9 +8,11 @@
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
 #include <quorvel/hmilayeredstate.h>
+#include <quorvel/hmistate.h>
 #include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
+#include <taldris/hmisubmoduleprovider.h>
 
 #include <QQmlContext>
 #include <QQmlEngine>
@@ -147,6 +149,16 @@ private slots:
             QVERIFY(!Taldris::HmiIntentManager::instance()->requestAction(
                     1, {QStringLiteral("0123")}));
         }) << QStringLiteral("HmiPhoneIntentHandler: the controller is gone, no call placed");
+        QTest::newRow("settings pages built again")
+                << std::function<void()>([] {
+                       Quorvel::HmiState settings(QStringLiteral("SETTINGS"));
+                       settings.setInitialHmiState(
+                               new Quorvel::HmiState(QStringLiteral("MENU"), &settings));
+                       QVERIFY(Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(
+                               3, &settings, QStringLiteral("SETTINGS"), 0));
+                   })
+                << QStringLiteral("HmiPhoneSettingsHostedSubmodule: the controller is gone, the "
+                                  "settings pages cannot stop a ringtone sample");
         QTest::newRow("low battery guard") << std::function<void()>([] {
             Mavrosk::PhoneSource::instance()->setBridgeValue(
                     QStringLiteral("lowBatteryNotification"), true);
