@@ -256,6 +256,57 @@ private slots:
         QVERIFY(tree.contactsList->isActive());
     }
 
+    // Targetless transitions next to each other in creation order fire in one turn: still in
+    // that order, and the popup requests and dismissals they make take effect after the last,
+    // in the order made.
+    void sharedTurn_data()
+    {
+        QTest::addColumn<bool>("thirdDismisses");
+        QTest::addColumn<QStringList>("stack");
+        QTest::addRow("both requested: the later on top")
+                << false << QStringList{QStringLiteral("T.Global"), QStringLiteral("T.Second")};
+        QTest::addRow("requested, then dismissed in the same notification")
+                << true << QStringList{QStringLiteral("T.Second")};
+    }
+    void sharedTurn()
+    {
+        QFETCH(bool, thirdDismisses);
+        QFETCH(QStringList, stack);
+        Tree tree;
+        auto *second = new PopupState(QStringLiteral("T.Second"), 1);
+        QStringList trace;
+        auto make = [&](const QString &name, QState *source, std::function<void()> action) {
+            auto *t = new HmiTransition(QStringLiteral("Notify"), source);
+            QObject::connect(t, &QAbstractTransition::triggered, t, [&trace, name, action] {
+                trace << name;
+                action();
+            });
+            return t;
+        };
+        make(QStringLiteral("menu"), tree.menu,
+             [&] { tree.machine->requestPopup(QStringLiteral("T.Global")); });
+        HmiTransition *adopted = make(QStringLiteral("adopted"), nullptr, [&] {
+            tree.machine->requestPopup(QStringLiteral("T.Second"));
+        });
+        make(QStringLiteral("phone"), tree.phone, [&] {
+            if (thirdDismisses)
+                tree.machine->dismissPopup(QStringLiteral("T.Global"));
+        });
+        make(QStringLiteral("home"), tree.home, [] {});
+        tree.machine->installRootHierarchy({}, {{StateLevel3, second}});
+        tree.start({{StateLevel3, adopted}});
+        tree.goTo(tree.phone);
+
+        tree.post(QStringLiteral("Notify"));
+
+        QCOMPARE(trace,
+                 (QStringList{QStringLiteral("menu"), QStringLiteral("adopted"),
+                              QStringLiteral("phone")}));
+        QCOMPARE(TestSupport::journalValues(QStringLiteral("popup-shown")),
+                 QStringList{QStringLiteral("T.Second")});
+        QCOMPARE(tree.machine->popupStack(QStringLiteral("T.Second")), stack);
+    }
+
     // The trigger of each kind, the guard's default and the transition data.
     void transitionKinds_data()
     {
@@ -385,6 +436,20 @@ private slots:
         tree.goTo(dummy);
         QCOMPARE(HmiViewState::lastKnownViewState(), QStringLiteral("Menu"));
         QCOMPARE(TestSupport::journalValues(QStringLiteral("view")).size(), 2);
+
+        // The back stack keeps the newest views only, and back still goes to the one before.
+        for (int i = 0; i < StateMachine::BackStackDepth; ++i) {
+            tree.goTo(tree.home);
+            tree.goTo(tree.phone);
+        }
+        const QStringList stack = tree.machine->backStack();
+        QCOMPARE(stack.size(), StateMachine::BackStackDepth);
+        QCOMPARE(stack.mid(stack.size() - 2),
+                 (QStringList{QStringLiteral("Home"), QStringLiteral("Menu")}));
+        QVERIFY(tree.machine->back());
+        processUntilIdle();
+        QCOMPARE(HmiViewState::activeViewState(), tree.home);
+        QCOMPARE(tree.machine->backStack().size(), StateMachine::BackStackDepth - 1);
     }
 };
 

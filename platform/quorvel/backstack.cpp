@@ -24,6 +24,9 @@ void StateMachinePrivate::viewEntered(HmiViewState *view)
             if (view->backStackEntryUnique())
                 backStack.removeAll(view);
             backStack.append(view);
+            // The oldest views drop off: a car runs for hours.
+            while (backStack.size() > StateMachine::BackStackDepth)
+                backStack.removeFirst();
         }
     }
     emit q->viewStateEntered(view);
@@ -41,12 +44,13 @@ bool StateMachinePrivate::back(int steps)
 {
     if (steps < 1)
         return false;
-    // Worked on a copy: nothing changes when there is nothing to go back to.
-    QList<QPointer<HmiViewState>> stack = backStack;
-    stack.removeAll(nullptr);
+    // The entries below `end` are the ones left; the stack is cut there only when there is
+    // somewhere to go back to.
+    backStack.removeAll(nullptr);
+    int end = backStack.size();
     HmiViewState *current = activeView;
-    if (current && !stack.isEmpty() && stack.last() == current)
-        stack.removeLast();
+    if (current && end > 0 && backStack.at(end - 1) == current)
+        --end;
 
     QAbstractState *target = nullptr;
     int remaining = steps;
@@ -57,8 +61,8 @@ bool StateMachinePrivate::back(int steps)
         && current->backTargetProviderState()) {
         if (auto *provider = qobject_cast<HmiViewState *>(current->backTargetProviderState())) {
             current = provider;
-            if (!stack.isEmpty() && stack.last() == current)
-                stack.removeLast();
+            if (end > 0 && backStack.at(end - 1) == current)
+                --end;
         } else {
             target = current->backTargetProviderState();
             --remaining;
@@ -68,8 +72,8 @@ bool StateMachinePrivate::back(int steps)
         target = current->directBackTarget();
         --remaining;
     }
-    while (remaining > 0 && !stack.isEmpty()) {
-        HmiViewState *entry = stack.takeLast();
+    while (remaining > 0 && end > 0) {
+        HmiViewState *entry = backStack.at(--end);
         bool accepted = true;
         if (current) {
             for (const QSharedPointer<HmiTargetFilter> &filter : current->backTargetFilters())
@@ -82,7 +86,7 @@ bool StateMachinePrivate::back(int steps)
     }
     if (!target)
         return false;
-    backStack = stack;
+    backStack.erase(backStack.begin() + end, backStack.end());
     // Going back to a view that names a back-stack state enters that state instead, so that
     // the component can choose its screen again.
     if (auto *view = qobject_cast<HmiViewState *>(target)) {

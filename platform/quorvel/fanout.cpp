@@ -17,52 +17,59 @@ QEvent::Type registeredType()
     return static_cast<QEvent::Type>(QEvent::registerEventType());
 }
 
+// The local index of QAbstractTransition::triggered(), for emitting it on a transition's behalf.
+const int TriggeredSignal = QMetaMethod::fromSignal(&QAbstractTransition::triggered).methodIndex()
+        - QAbstractTransition::staticMetaObject.methodOffset();
+
 } // namespace
 
-FireEvent::FireEvent(HmiAbstractTransition *transition, quint64 batch, const QVariant &data)
+// The framework's event types, registered once when the library is loaded: telling an event's
+// type is one comparison.
+const QEvent::Type FireEvent::s_type = registeredType();
+const QEvent::Type RouteEvent::s_type = registeredType();
+const QEvent::Type PopupSyncEvent::s_type = registeredType();
+
+FireEvent::FireEvent(const FireTurn &turn, quint64 batch, bool last)
     : QEvent(eventType())
-    , transition(transition)
+    , turn(turn)
     , batch(batch)
-    , data(data)
+    , last(last)
 { }
-
-QEvent::Type FireEvent::eventType()
-{
-    static const QEvent::Type type = registeredType();
-    return type;
-}
-
-BatchEndEvent::BatchEndEvent(quint64 batch)
-    : QEvent(eventType())
-    , batch(batch)
-{ }
-
-QEvent::Type BatchEndEvent::eventType()
-{
-    static const QEvent::Type type = registeredType();
-    return type;
-}
 
 RouteEvent::RouteEvent(QAbstractState *target, QEvent::Type type)
     : QEvent(type == QEvent::None ? eventType() : type)
     , target(target)
 { }
 
-QEvent::Type RouteEvent::eventType()
-{
-    static const QEvent::Type type = registeredType();
-    return type;
-}
-
 PopupSyncEvent::PopupSyncEvent(PopupRegion *region)
     : QEvent(eventType())
     , region(region)
 { }
 
-QEvent::Type PopupSyncEvent::eventType()
+FanOutTransition::FanOutTransition(StateMachinePrivate *d, QState *source)
+    : QAbstractTransition(source)
+    , d(d)
 {
-    static const QEvent::Type type = registeredType();
-    return type;
+    setObjectName(QStringLiteral("FrameworkFanOut"));
+}
+
+void FanOutTransition::arm(QEvent *event, const FireTurn &turn)
+{
+    m_armed = event;
+    m_turn = turn;
+}
+
+// Only the test: the turn runs in the step that follows the selection.
+void FanOutTransition::disarm()
+{
+    m_armed = nullptr;
+}
+
+void FanOutTransition::onTransition(QEvent *)
+{
+    const FireTurn turn = std::move(m_turn);
+    m_turn.clear();
+    d->fireTargetless(turn);
 }
 
 SignalRelay::SignalRelay(StateMachinePrivate *d, const QObject *sender, int signalIndex)
@@ -139,10 +146,10 @@ void StateMachinePrivate::dispatchSignal(SignalRelay *relay, void **argv)
 }
 
 // One notification: ask every listener, in creation order, whether it matches, whether its
-// source is active and whether its guard allows; then queue the enabled ones, in that order,
-// followed by the end of the fan-out.
+// source is active and whether its guard allows; then queue the enabled ones, in that order, in
+// turns. `current` is the event that the machine is taking, when the notification is one.
 void StateMachinePrivate::notify(const QVector<HmiAbstractTransition *> &listeners,
-                                 const QVariantList &arguments, QEvent *testEvent)
+                                 const QVariantList &arguments, QEvent *testEvent, QEvent *current)
 {
     if (listeners.isEmpty())
         return;
@@ -172,11 +179,84 @@ void StateMachinePrivate::notify(const QVector<HmiAbstractTransition *> &listene
     }
     if (enabled.isEmpty())
         return;
+
+    // The turns: a run of targetless transitions next to each other fires as one (Qt takes one
+    // transition selection for them all, and they emit triggered() in creation order); a targeted
+    // one fires alone, after the turns before it, so that it leaves and enters states as it
+    // would have in creation order.
+    QVector<FireTurn> turns;
+    bool runsOn = false;
+    for (int i = 0; i < enabled.size(); ++i) {
+        const bool targetless = !enabled.at(i)->targetState();
+        if (!targetless || !runsOn)
+            turns.append(FireTurn());
+        turns.last().append({enabled.at(i), data.at(i)});
+        runsOn = targetless;
+    }
     const quint64 batch = ++m_batch;
-    for (int i = 0; i < enabled.size(); ++i)
-        q->QStateMachine::postEvent(new FireEvent(enabled.at(i), batch, data.at(i)),
+    int posted = 0;
+    if (current) {
+        // The notification is the event the machine is taking: its first turn goes with it. The
+        // machine would take that turn next anyway: its internal queue, where the turns wait, is
+        // empty whenever it takes a posted event.
+        currentBatch = batch;
+        lastTurn = turns.size() == 1;
+        turnSteps = takeTurn(turns.first(), current);
+        posted = 1;
+    }
+    for (int i = posted; i < turns.size(); ++i)
+        q->QStateMachine::postEvent(new FireEvent(turns.at(i), batch, i == turns.size() - 1),
                                     QStateMachine::HighPriority);
-    q->QStateMachine::postEvent(new BatchEndEvent(batch), QStateMachine::HighPriority);
+}
+
+// Arms the turn's transitions for `event`: a targeted one itself (placed for its turn), a run of
+// targetless ones through the fan-out transition. Returns whether the machine will take a step.
+bool StateMachinePrivate::takeTurn(const FireTurn &turn, QEvent *event)
+{
+    parkMovedTransition();
+    HmiAbstractTransition *first = turn.first().transition;
+    if (first && first->targetState()) {
+        const bool steps = first->m_adopted || isActive(first->sourceState());
+        first->m_data = turn.first().data;
+        first->m_armed = event;
+        armedTransition = first;
+        placeForTurn(first, event);
+        return steps;
+    }
+    for (const FireEntry &entry : turn) {
+        HmiAbstractTransition *transition = entry.transition;
+        if (transition && (transition->m_adopted || isActive(transition->sourceState()))) {
+            fanOut->arm(event, turn);
+            return true;
+        }
+    }
+    return false;
+}
+
+// A run of targetless transitions, in creation order; one whose source is no longer active is
+// dropped, as Qt would drop it.
+void StateMachinePrivate::fireTargetless(const FireTurn &turn)
+{
+    for (const FireEntry &entry : turn) {
+        HmiAbstractTransition *transition = entry.transition;
+        if (!transition || (!transition->m_adopted && !isActive(transition->sourceState())))
+            continue;
+        transition->m_data = entry.data;
+        QMetaObject::activate(transition, &QAbstractTransition::staticMetaObject, TriggeredSignal,
+                              nullptr);
+    }
+}
+
+// The popup requests and dismissals made by a notification's transitions take effect when its
+// last turn is over: right after its step, or at once when its transition is no longer armed.
+// No event of its own closes a notification: the last turn knows it is the last.
+void StateMachinePrivate::finishBatch()
+{
+    lastTurn = false;
+    const QList<PopupOp> ops = batchOps.take(currentBatch);
+    currentBatch = 0;
+    for (const PopupOp &op : ops)
+        perform(op);
 }
 
 // How the machine handles what it is given, in order:
@@ -185,14 +265,18 @@ void StateMachinePrivate::notify(const QVector<HmiAbstractTransition *> &listene
 //    property change of a watched sender at once, when it is emitted (SignalRelay). notify()
 //    asks every listener in creation order: its trigger (asked even while its source is
 //    inactive, so that property transitions can follow values), then whether its source is
-//    active (adopted transitions always are), then its guard. It posts one FireEvent per enabled
-//    transition, in that order, and a BatchEndEvent after them. All framework events are posted
-//    at high priority: they run before any module event still waiting, in posting order.
-// 2. A FireEvent is one transition's turn (placeForTurn): Qt takes the transition for that event
-//    only, if its source is still active (otherwise it is dropped). Popup requests and
-//    dismissals made while it runs are kept for the batch.
-// 3. The BatchEndEvent applies the batch's popup requests and dismissals in the order made;
-//    each changes a region's stack and asks for that region's PopupSyncEvent.
+//    active (adopted transitions always are), then its guard. It splits the enabled ones, in
+//    that order, into turns (a targeted transition alone, a run of targetless ones together)
+//    and posts one FireEvent per turn; an HmiEvent takes its first turn itself. All framework
+//    events are posted at high priority: they run before any module event still waiting, in
+//    posting order.
+// 2. A FireEvent is one turn (takeTurn): Qt takes the turn's transition for that event only, if
+//    its source is still active (otherwise it is dropped; placeForTurn moves a targeted one
+//    where it must fire from). Popup requests and dismissals made while it runs are kept for the
+//    batch.
+// 3. When the last turn is over, the batch's popup requests and dismissals apply in the order
+//    made (finishBatch); each changes a region's stack and asks for that region's
+//    PopupSyncEvent.
 // 4. A PopupSyncEvent opens and closes the region's popups as its stack says, all in one step
 //    (syncRegion); which popup is on top is reported when the step ends.
 // 5. A RouteEvent (or a back event) moves to a state through the router transition placed on
@@ -201,6 +285,10 @@ void StateMachinePrivate::notify(const QVector<HmiAbstractTransition *> &listene
 // (entry and exit slots, steps 4 and 5) take effect when that step ends (endMicrostep).
 void StateMachinePrivate::beginSelect(QEvent *event)
 {
+    // A last turn that took no step (unexpected) still closes its batch.
+    if (lastTurn)
+        finishBatch();
+    turnSteps = false;
     const QEvent::Type type = event->type();
     if (type == QEvent::None)
         return;
@@ -208,21 +296,16 @@ void StateMachinePrivate::beginSelect(QEvent *event)
     if (type == FireEvent::eventType()) {
         auto *fire = static_cast<FireEvent *>(event);
         currentBatch = fire->batch;
-        if (HmiAbstractTransition *transition = fire->transition) {
-            transition->m_data = fire->data;
-            placeForTurn(transition, event);
-        }
+        lastTurn = fire->last;
+        turnSteps = takeTurn(fire->turn, event);
         return;
     }
 
     currentBatch = 0;
     if (type == HmiEvent::eventType()) {
         auto *hmiEvent = static_cast<HmiEvent *>(event);
-        notify(eventListeners.value(hmiEvent->name()), QVariantList{hmiEvent->value()}, event);
-    } else if (type == BatchEndEvent::eventType()) {
-        const QList<PopupOp> ops = batchOps.take(static_cast<BatchEndEvent *>(event)->batch);
-        for (const PopupOp &op : ops)
-            perform(op);
+        notify(eventListeners.value(hmiEvent->name()), QVariantList{hmiEvent->value()}, event,
+               event);
     } else if (type == PopupSyncEvent::eventType()) {
         if (PopupRegion *region = static_cast<PopupSyncEvent *>(event)->region)
             syncRegion(region, event);
@@ -230,6 +313,19 @@ void StateMachinePrivate::beginSelect(QEvent *event)
         // Either type: a back event posted by someone else is no route.
         route(event, routeEvent->target);
     }
+}
+
+// Armed transitions answer for one event only, and the machine asks nothing more once it has
+// selected.
+void StateMachinePrivate::endSelect()
+{
+    if (armedTransition) {
+        armedTransition->m_armed = nullptr;
+        armedTransition = nullptr;
+    }
+    fanOut->disarm();
+    if (lastTurn && !turnSteps)
+        finishBatch();
 }
 
 void StateMachinePrivate::endMicrostep()
@@ -250,6 +346,8 @@ void StateMachinePrivate::endMicrostep()
         for (const PopupOp &op : ops)
             perform(op);
     }
+    if (lastTurn)
+        finishBatch();
 }
 
 } // namespace Quorvel

@@ -98,16 +98,18 @@ void HmiAbstractTransition::setTransitionData(const QVariant &data)
     m_data = data;
 }
 
+// The machine asks every transition of every active state for each event it takes: the answer
+// is one comparison. The framework arms a targeted transition for the event of its turn (a
+// targetless one fires through the framework's fan-out transition).
 bool HmiAbstractTransition::eventTest(QEvent *event)
 {
-    return event && event->type() == FireEvent::eventType()
-            && static_cast<FireEvent *>(event)->transition == this;
+    return event == m_armed;
 }
 
+// The turn has set the transition data already.
 void HmiAbstractTransition::onTransition(QEvent *event)
 {
-    if (event && event->type() == FireEvent::eventType())
-        m_data = static_cast<FireEvent *>(event)->data;
+    Q_UNUSED(event)
 }
 
 bool HmiAbstractTransition::runGuard(QEvent *event)

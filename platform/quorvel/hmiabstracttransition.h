@@ -80,6 +80,7 @@ private:
     bool runGuard(QEvent *event);
 
     quint64 m_sequence = 0;
+    QEvent *m_armed = nullptr; // the event of its turn, while the machine selects
     bool m_allow = false;
     bool m_allowDefault = false;
     QVariant m_data;

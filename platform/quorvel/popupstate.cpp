@@ -16,13 +16,7 @@ PopupState::PopupState(const QString &viewId, HmiLayeredState *layer, int priori
     : HmiState(viewId, layer ? layer->layerState() : nullptr)
     , m_priority(priority)
     , m_layer(layer)
-    , m_timer(new QTimer(this))
 {
-    m_timer->setSingleShot(true);
-    connect(m_timer, &QTimer::timeout, this, [this] {
-        if (StateMachinePrivate *d = StateMachinePrivate::existing())
-            d->dismissPopupNow(this);
-    });
     StateMachinePrivate::get()->registerPopup(this);
 }
 
@@ -55,7 +49,7 @@ QVariant PopupState::popupData() const
 void PopupState::setAutoDismissTimeoutActive(bool active)
 {
     m_autoDismiss = active;
-    if (!active)
+    if (!active && m_timer)
         m_timer->stop();
 }
 
@@ -67,7 +61,8 @@ bool PopupState::autoDismissTimeoutActive() const
 void PopupState::setAutoDismissTimeoutInterval(int milliseconds)
 {
     m_autoDismissInterval = milliseconds;
-    m_timer->setInterval(milliseconds);
+    if (m_timer)
+        m_timer->setInterval(milliseconds);
 }
 
 int PopupState::autoDismissTimeoutInterval() const
@@ -78,7 +73,22 @@ int PopupState::autoDismissTimeoutInterval() const
 void PopupState::restartAutoDismissTimer()
 {
     if (m_autoDismiss && m_autoDismissInterval > 0 && isActive())
-        m_timer->start();
+        autoDismissTimer()->start();
+}
+
+// Made when the popup first shows with auto-dismiss: most popups never do.
+QTimer *PopupState::autoDismissTimer()
+{
+    if (!m_timer) {
+        m_timer = new QTimer(this);
+        m_timer->setSingleShot(true);
+        m_timer->setInterval(m_autoDismissInterval);
+        connect(m_timer, &QTimer::timeout, this, [this] {
+            if (StateMachinePrivate *d = StateMachinePrivate::existing())
+                d->dismissPopupNow(this);
+        });
+    }
+    return m_timer;
 }
 
 void PopupState::registerDismissingTransition(QAbstractTransition *transition)
@@ -101,7 +111,7 @@ void PopupState::onEntry(QEvent *event)
 {
     HmiState::onEntry(event);
     if (m_autoDismiss && m_autoDismissInterval > 0)
-        m_timer->start();
+        autoDismissTimer()->start();
     if (StateMachinePrivate *d = StateMachinePrivate::existing())
         d->popupEntered(this);
 }
@@ -109,7 +119,8 @@ void PopupState::onEntry(QEvent *event)
 void PopupState::onExit(QEvent *event)
 {
     HmiState::onExit(event);
-    m_timer->stop();
+    if (m_timer)
+        m_timer->stop();
     if (StateMachinePrivate *d = StateMachinePrivate::existing())
         d->popupExited(this);
 }

@@ -63,6 +63,8 @@ protected:
 private:
     friend class StateMachinePrivate;
 
+    QTimer *autoDismissTimer();
+
     int m_priority = 0;
     QPointer<HmiLayeredState> m_layer;
     QVariant m_data;

@@ -59,6 +59,9 @@ void StateMachinePrivate::build()
     levels[0]->setInitialState(levels[1]);
     levels[2]->setInitialState(layers);
     q->setInitialState(levels[0]);
+    // On the outermost level, which is always active (the machine takes no transition from its
+    // root state).
+    fanOut = new FanOutTransition(this, levels[0]);
     router = new ArmedTransition(QStringLiteral("FrameworkRoute"), q);
     adoptedHolder = new QState(q);
     adoptedHolder->setObjectName(QStringLiteral("AdoptedTransitions"));
@@ -305,6 +308,12 @@ QAbstractState *StateMachine::findViewTarget(const QString &nameOrViewId) const
 void StateMachine::beginSelectTransitions(QEvent *event)
 {
     d->beginSelect(event);
+}
+
+void StateMachine::endSelectTransitions(QEvent *event)
+{
+    Q_UNUSED(event)
+    d->endSelect();
 }
 
 void StateMachine::beginMicrostep(QEvent *event)

@@ -103,6 +103,8 @@ public:
     // Back navigation through the views shown (see HmiViewState for the per-view settings).
     // Returns false when there is nothing to go back to.
     bool back(int steps = 1);
+    // The most views the back stack keeps: the oldest drop off.
+    static constexpr int BackStackDepth = 50;
     // The view states in the back stack, by state name, bottom first.
     QStringList backStack() const;
     // Finds the view state that shows the view `nameOrViewId`, or else the state of that name.
@@ -115,6 +117,7 @@ signals:
 
 protected:
     void beginSelectTransitions(QEvent *event) override;
+    void endSelectTransitions(QEvent *event) override;
     void beginMicrostep(QEvent *event) override;
     void endMicrostep(QEvent *event) override;
 

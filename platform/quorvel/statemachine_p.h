@@ -25,27 +25,48 @@ class StateMachinePrivate;
 // The framework's own events. Each is posted at high priority, so it is handled before any
 // module event still waiting.
 
-// Asks one transition to fire, as its turn in the fan-out of one notification.
+// One enabled transition of a notification, with the data it fires with.
+struct FireEntry
+{
+    QPointer<HmiAbstractTransition> transition;
+    QVariant data;
+};
+// A turn in the fan-out of one notification: the transitions that fire together, for one event
+// (one targeted transition, or a run of targetless ones next to each other in creation order).
+using FireTurn = QVector<FireEntry>;
+
+// Asks for one turn of a notification's fan-out; `last` closes the notification.
 class FireEvent : public QEvent
 {
 public:
-    FireEvent(HmiAbstractTransition *transition, quint64 batch, const QVariant &data);
-    static QEvent::Type eventType();
+    FireEvent(const FireTurn &turn, quint64 batch, bool last);
+    static QEvent::Type eventType() { return s_type; }
 
-    QPointer<HmiAbstractTransition> transition;
+    FireTurn turn;
     quint64 batch;
-    QVariant data;
+    bool last;
+
+private:
+    static const QEvent::Type s_type;
 };
 
-// Closes the fan-out of one notification: the popup requests and dismissals that its
-// transitions made take effect now.
-class BatchEndEvent : public QEvent
+// Fires a run of targetless transitions as one transition: the machine takes it for the turn's
+// event only, and it emits each transition's triggered() in creation order.
+class FanOutTransition : public QAbstractTransition
 {
 public:
-    explicit BatchEndEvent(quint64 batch);
-    static QEvent::Type eventType();
+    FanOutTransition(StateMachinePrivate *d, QState *source);
+    void arm(QEvent *event, const FireTurn &turn);
+    void disarm();
 
-    quint64 batch;
+protected:
+    bool eventTest(QEvent *event) override { return event == m_armed; }
+    void onTransition(QEvent *) override;
+
+private:
+    StateMachinePrivate *d;
+    QEvent *m_armed = nullptr;
+    FireTurn m_turn;
 };
 
 // Moves the machine to a state (navigation). A move made by back navigation has the type
@@ -54,9 +75,12 @@ class RouteEvent : public QEvent
 {
 public:
     RouteEvent(QAbstractState *target, QEvent::Type type);
-    static QEvent::Type eventType();
+    static QEvent::Type eventType() { return s_type; }
 
     QPointer<QAbstractState> target;
+
+private:
+    static const QEvent::Type s_type;
 };
 
 // Opens and closes the popups of one region as its stack says.
@@ -64,9 +88,12 @@ class PopupSyncEvent : public QEvent
 {
 public:
     explicit PopupSyncEvent(PopupRegion *region);
-    static QEvent::Type eventType();
+    static QEvent::Type eventType() { return s_type; }
 
     QPointer<PopupRegion> region;
+
+private:
+    static const QEvent::Type s_type;
 };
 
 // A framework transition that the machine takes for one event only: the event it is armed with.
@@ -160,8 +187,12 @@ public:
     void forget(HmiAbstractTransition *transition);
     void dispatchSignal(SignalRelay *relay, void **argv);
     void notify(const QVector<HmiAbstractTransition *> &listeners, const QVariantList &arguments,
-                QEvent *testEvent);
+                QEvent *testEvent, QEvent *current = nullptr);
+    bool takeTurn(const FireTurn &turn, QEvent *event);
+    void fireTargetless(const FireTurn &turn);
+    void finishBatch();
     void beginSelect(QEvent *event);
+    void endSelect();
     void endMicrostep();
 
     // The turn of one fired transition (adoption.cpp): adopted ones and those that leave an open
@@ -233,6 +264,11 @@ public:
 
     quint64 m_batch = 0;
     quint64 currentBatch = 0;
+    // The turn being taken closes its notification; whether the machine takes a step for it.
+    bool lastTurn = false;
+    bool turnSteps = false;
+    FanOutTransition *fanOut = nullptr;
+    QPointer<HmiAbstractTransition> armedTransition;
     QHash<quint64, QList<PopupOp>> batchOps;
     QList<PopupOp> microstepOps;
     bool inMicrostep = false;
