@@ -383,7 +383,11 @@ int main(int argc, char *argv[])
     const QCommandLineOption tree(QStringLiteral("tree"),
                                   QStringLiteral("(internal) the floor's tree."),
                                   QStringLiteral("file"));
-    parser.addOptions({quick, plugin, coldChild, tree});
+    const QCommandLineOption runs(QStringLiteral("runs"),
+                                  QStringLiteral("The steps of the short and the long run "
+                                                 "(default 10000,100000)."),
+                                  QStringLiteral("short,long"));
+    parser.addOptions({quick, plugin, coldChild, tree, runs});
     parser.process(app);
 
     Settings settings;
@@ -400,6 +404,11 @@ int main(int argc, char *argv[])
     } else if (meter.instructions()) {
         // Instruction counts vary little from turn to turn.
         settings.repetitions = 100;
+    }
+    if (parser.isSet(runs)) {
+        const QStringList lengths = parser.value(runs).split(QLatin1Char(','));
+        settings.shortRun = qMax(1, lengths.value(0).toInt());
+        settings.longRun = qMax(1, lengths.value(1).toInt());
     }
 
     std::printf("hmiphone-bench: cost of one turn in %s (%s)%s\n",
