@@ -92,12 +92,11 @@ const char *const names[][2] = {
         {"$pbInitiated", "PhonebookDownloadInitiated"},
 };
 
-class TestConnection : public QObject
+class TestConnection : public TestSupport::Suite
 {
     Q_OBJECT
 
 private slots:
-    void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
     void reactions_data();
     void reactions();
 
@@ -108,7 +107,6 @@ private:
     QStringList m_outputs;
     qint64 m_start = 0; // the virtual time the row's steps began
     qint64 m_minute = 0; // the last minute marked in the outputs
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 void TestConnection::reactions_data()
