@@ -121,11 +121,11 @@ void TestCallReactions::answer()
     TestSupport::processUntilIdle();
     QVERIFY(GlobalHmi::shown(QStringLiteral("IncomingCall")));
 
-    const qint64 since = GlobalHmi::mark();
+    qint64 since = GlobalHmi::mark();
     if (event.isEmpty())
         emit phone()->phoneIncomingCallRemoteRejection();
     else
-        GlobalHmi::post(event);
+        since = GlobalHmi::post(event);
     TestSupport::processUntilIdle();
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
     QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
@@ -340,8 +340,7 @@ void TestCallReactions::roamingConfirmation()
     phone()->setOutboundRoamingRecentCallIndex(5);
     QVERIFY(m_hmi->run());
 
-    const qint64 since = GlobalHmi::mark();
-    GlobalHmi::post(Events::HmiPhone_ConfirmRoamingCall);
+    const qint64 since = GlobalHmi::post(Events::HmiPhone_ConfirmRoamingCall);
     const auto entries = Platform::Journal::instance()->entriesSince(since);
     QVERIFY(!entries.isEmpty());
     QCOMPARE(entries.first().fields.value(QStringLiteral("call")).toString(), command);

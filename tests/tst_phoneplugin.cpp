@@ -32,13 +32,14 @@ static QStringList tree(const QState *state, const QStringList &descend, const Q
     QStringList names;
     auto *layered = qobject_cast<const Quorvel::HmiLayeredState *>(state);
     QObjectList children = (layered ? layered->exclusiveState() : state)->children();
-    if (layered)
-        children += layered->layerState()->children();
+    if (layered) // each popup of the layer sits in a slot of its own
+        for (const QObject *slot : layered->layerState()->children())
+            for (QObject *popup :
+                 slot->findChildren<Quorvel::PopupState *>(QString(), Qt::FindDirectChildrenOnly))
+                children.append(popup);
     for (const QObject *child : children) {
         auto *childState = qobject_cast<const QState *>(child);
-        if (!childState
-            || (layered && child->parent() == layered->layerState()
-                && !qobject_cast<const Quorvel::PopupState *>(child)))
+        if (!childState)
             continue;
         names.append(prefix + child->objectName());
         if (descend.contains(child->objectName()))

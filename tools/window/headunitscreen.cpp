@@ -17,8 +17,8 @@ namespace {
 bool changesScreen(const QString &kind)
 {
     return kind == QLatin1String("view") || kind == QLatin1String("popup-shown")
-            || kind == QLatin1String("popup-hidden") || kind == QLatin1String("transient")
-            || kind == QLatin1String("transient-hide");
+            || kind == QLatin1String("popup-hidden") || kind == QLatin1String("popup-closed")
+            || kind == QLatin1String("transient") || kind == QLatin1String("transient-hide");
 }
 
 QString nameOf(const QString &viewId)
