@@ -392,7 +392,15 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
 namespace {
 
 enum Situation { Idle, Ringing, Waiting, OneCall, TwoCalls, Dialling };
-enum Condition { Private = 1, Blocked = 2, Projection = 4, Rendering = 8, DoNotDisturb = 16 };
+// Covered: another popup comes up over the call popup before the key.
+enum Condition {
+    Private = 1,
+    Blocked = 2,
+    Projection = 4,
+    Rendering = 8,
+    DoNotDisturb = 16,
+    Covered = 32
+};
 
 } // namespace
 
@@ -484,6 +492,8 @@ void TestCallReactions::keys_data()
     row("waiting: 91 short", Waiting, 0, 91, 2, rejected + closeWaiting + rejectEvent);
     row("waiting, rendering: send short", Waiting, Rendering, 49, 2, closeWaiting);
     row("waiting, rendering: 77", Waiting, Rendering, 77, 1, {});
+    row("waiting, covered: phone key", Waiting, Covered, 12, 2, accepted + closeWaiting);
+    row("waiting, covered: 78", Waiting, Covered, 78, 1, rejectWaiting + closeWaiting);
     row("waiting, blocked: end", Waiting, Blocked, 50, 1, {});
     row("one call: phone key", OneCall, 0, 12, 2, {});
     row("one call: phone key long ends", OneCall, 0, 12, 3, endCall);
@@ -547,6 +557,11 @@ void TestCallReactions::keys()
     if (situation == Ringing || situation == Waiting) {
         phone()->setIncomingCall(true);
         TestSupport::processUntilIdle();
+    }
+    if (conditions & Covered) {
+        emit phone()->phoneRoamingModeReceived();
+        TestSupport::processUntilIdle();
+        QVERIFY(GlobalHmi::shown(QStringLiteral("RoamingWarning")));
     }
 
     const qint64 since = GlobalHmi::mark();
