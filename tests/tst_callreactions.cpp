@@ -166,18 +166,19 @@ void TestCallReactions::waitingCall()
 void TestCallReactions::ringingEnds_data()
 {
     QTest::addColumn<bool>("duringCall");
-    QTest::addColumn<bool>("connectedFirst");
+    QTest::addColumn<bool>("connectionFirst"); // the call connects (or the connected one ends)
 
     QTest::addRow("answered on the handset, connected first") << false << true;
     QTest::addRow("answered on the handset, ringing ended first") << false << false;
     QTest::addRow("waiting call ends") << true << false;
+    QTest::addRow("connected call ends, then the waiting call") << true << true;
 }
 
 // However the ringing ends, and in whichever order the phone reports it, no call popup stays.
 void TestCallReactions::ringingEnds()
 {
     QFETCH(bool, duringCall);
-    QFETCH(bool, connectedFirst);
+    QFETCH(bool, connectionFirst);
     phone()->setCallConnected(duringCall);
     QVERIFY(m_hmi->run());
     phone()->setIncomingCall(true);
@@ -185,9 +186,9 @@ void TestCallReactions::ringingEnds()
     QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
                                         : QStringLiteral("IncomingCall")));
 
-    for (const bool connectNow : {connectedFirst, !connectedFirst}) {
-        if (connectNow)
-            phone()->setCallConnected(true);
+    for (const bool connectionNow : {connectionFirst, !connectionFirst}) {
+        if (connectionNow)
+            phone()->setCallConnected(!duringCall);
         else
             phone()->setIncomingCall(false);
         TestSupport::processUntilIdle();
