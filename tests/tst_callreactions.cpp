@@ -13,13 +13,14 @@
 using namespace HmiPhone;
 using Outputs = QStringList;
 
-class TestCallReactions : public QObject
+class TestCallReactions : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
+    void tearDown() override;
 private slots:
-    void init() { m_hmi = std::make_unique<GlobalHmi>(); }
-    void cleanup();
 
     void incomingCall_data();
     void incomingCall();
@@ -44,13 +45,11 @@ private:
     Mavrosk::PhoneSource *phone() const { return GlobalHmi::phone(); }
 
     std::unique_ptr<GlobalHmi> m_hmi;
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
-void TestCallReactions::cleanup()
+void TestCallReactions::tearDown()
 {
     m_hmi.reset();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
 }
 
 void TestCallReactions::incomingCall_data()
@@ -166,18 +165,19 @@ void TestCallReactions::waitingCall()
 void TestCallReactions::ringingEnds_data()
 {
     QTest::addColumn<bool>("duringCall");
-    QTest::addColumn<bool>("connectedFirst");
+    QTest::addColumn<bool>("connectionFirst"); // the call connects (or the connected one ends)
 
     QTest::addRow("answered on the handset, connected first") << false << true;
     QTest::addRow("answered on the handset, ringing ended first") << false << false;
     QTest::addRow("waiting call ends") << true << false;
+    QTest::addRow("connected call ends, then the waiting call") << true << true;
 }
 
 // However the ringing ends, and in whichever order the phone reports it, no call popup stays.
 void TestCallReactions::ringingEnds()
 {
     QFETCH(bool, duringCall);
-    QFETCH(bool, connectedFirst);
+    QFETCH(bool, connectionFirst);
     phone()->setCallConnected(duringCall);
     QVERIFY(m_hmi->run());
     phone()->setIncomingCall(true);
@@ -185,9 +185,9 @@ void TestCallReactions::ringingEnds()
     QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
                                         : QStringLiteral("IncomingCall")));
 
-    for (const bool connectNow : {connectedFirst, !connectedFirst}) {
-        if (connectNow)
-            phone()->setCallConnected(true);
+    for (const bool connectionNow : {connectionFirst, !connectionFirst}) {
+        if (connectionNow)
+            phone()->setCallConnected(!duringCall);
         else
             phone()->setIncomingCall(false);
         TestSupport::processUntilIdle();
@@ -391,7 +391,15 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
 namespace {
 
 enum Situation { Idle, Ringing, Waiting, OneCall, TwoCalls, Dialling };
-enum Condition { Private = 1, Blocked = 2, Projection = 4, Rendering = 8, DoNotDisturb = 16 };
+// Covered: another popup comes up over the call popup before the key.
+enum Condition {
+    Private = 1,
+    Blocked = 2,
+    Projection = 4,
+    Rendering = 8,
+    DoNotDisturb = 16,
+    Covered = 32
+};
 
 } // namespace
 
@@ -483,6 +491,8 @@ void TestCallReactions::keys_data()
     row("waiting: 91 short", Waiting, 0, 91, 2, rejected + closeWaiting + rejectEvent);
     row("waiting, rendering: send short", Waiting, Rendering, 49, 2, closeWaiting);
     row("waiting, rendering: 77", Waiting, Rendering, 77, 1, {});
+    row("waiting, covered: phone key", Waiting, Covered, 12, 2, accepted + closeWaiting);
+    row("waiting, covered: 78", Waiting, Covered, 78, 1, rejectWaiting + closeWaiting);
     row("waiting, blocked: end", Waiting, Blocked, 50, 1, {});
     row("one call: phone key", OneCall, 0, 12, 2, {});
     row("one call: phone key long ends", OneCall, 0, 12, 3, endCall);
@@ -546,6 +556,11 @@ void TestCallReactions::keys()
     if (situation == Ringing || situation == Waiting) {
         phone()->setIncomingCall(true);
         TestSupport::processUntilIdle();
+    }
+    if (conditions & Covered) {
+        emit phone()->phoneRoamingModeReceived();
+        TestSupport::processUntilIdle();
+        QVERIFY(GlobalHmi::shown(QStringLiteral("RoamingWarning")));
     }
 
     const qint64 since = GlobalHmi::mark();

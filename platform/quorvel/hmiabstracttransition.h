@@ -79,7 +79,6 @@ private:
     // Asks the connected guard slots; true when there is none.
     bool runGuard(QEvent *event);
 
-    quint64 m_sequence = 0;
     QEvent *m_armed = nullptr; // the event of its turn, while the machine selects
     bool m_allow = false;
     bool m_allowDefault = false;
