@@ -198,6 +198,7 @@ public:
     void syncRegion(PopupRegion *region, QEvent *event);
     void markTopToReport(PopupRegion *region);
     void reportTop(PopupRegion *region);
+    void putOnTop(PopupRegion *region, PopupState *top);
     void reportTops();
     QStringList openPopups() const;
 
