@@ -53,11 +53,7 @@ public:
 
     static Mavrosk::PhoneSource *phone() { return Mavrosk::PhoneSource::instance(); }
     static qint64 mark() { return Platform::Journal::instance()->lastSequence(); }
-    static void post(const QString &event)
-    {
-        Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(event));
-        TestSupport::processUntilIdle();
-    }
+    static qint64 post(const QString &event) { return TestSupport::post(event); }
 
     // What a driver or the phone noticed since `since`, in order, as "kind name": popups asked
     // for and dismissed, views asked for and shown (by view name), transients, events posted,

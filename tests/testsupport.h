@@ -26,10 +26,14 @@ inline qint64 mark()
     return Platform::Journal::instance()->lastSequence();
 }
 
-inline void post(const QString &name, const QVariant &value = QVariant())
+// Posts the event and lets the machine settle. Returns the journal's mark just after the event's
+// own entry, so that a test can read what the event caused.
+inline qint64 post(const QString &name, const QVariant &value = QVariant())
 {
     Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(name, value));
+    const qint64 posted = mark();
     processUntilIdle();
+    return posted;
 }
 
 inline QStringList activeStates()

@@ -208,16 +208,22 @@ private slots:
         QVERIFY(!action.enabledBinding(&sender, SIGNAL(noSuchSignal(bool))));
     }
 
-    void moduleControllerPostsLater_data()
+    // Events posted through the module controller or straight to the machine: journaled once
+    // when posted, handled later, held until the machine runs.
+    void postedEvents_data()
     {
         QTest::addColumn<bool>("startFirst");
-        QTest::addRow("running machine") << true;
-        QTest::addRow("posted before the machine starts") << false;
+        QTest::addColumn<bool>("viaController");
+        QTest::addRow("controller, running machine") << true << true;
+        QTest::addRow("controller, before the machine starts") << false << true;
+        QTest::addRow("straight to the machine, running") << true << false;
+        QTest::addRow("straight to the machine, before it starts") << false << false;
     }
 
-    void moduleControllerPostsLater()
+    void postedEvents()
     {
         QFETCH(bool, startFirst);
+        QFETCH(bool, viaController);
         // Held for a machine destroyed before it started: never reaches the next one.
         Brisken::ModuleController().postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 7));
         Quorvel::StateMachine::destroyInstance();
@@ -227,8 +233,13 @@ private slots:
         Brisken::ModuleController controller;
         const qint64 since = Journal::instance()->lastSequence();
 
-        controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("Fire"), 42));
-        controller.postEvent(new Quorvel::HmiEvent(QStringLiteral("fire")));
+        for (auto *event : {new Quorvel::HmiEvent(QStringLiteral("Fire"), 42),
+                            new Quorvel::HmiEvent(QStringLiteral("fire"))}) {
+            if (viaController)
+                controller.postEvent(event);
+            else
+                machine.machine->postEvent(event);
+        }
 
         QCOMPARE(machine.fired, 0);
         QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), since),

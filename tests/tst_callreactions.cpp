@@ -121,11 +121,11 @@ void TestCallReactions::answer()
     TestSupport::processUntilIdle();
     QVERIFY(GlobalHmi::shown(QStringLiteral("IncomingCall")));
 
-    const qint64 since = GlobalHmi::mark();
+    qint64 since = GlobalHmi::mark();
     if (event.isEmpty())
         emit phone()->phoneIncomingCallRemoteRejection();
     else
-        GlobalHmi::post(event);
+        since = GlobalHmi::post(event);
     TestSupport::processUntilIdle();
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
     QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
@@ -166,18 +166,19 @@ void TestCallReactions::waitingCall()
 void TestCallReactions::ringingEnds_data()
 {
     QTest::addColumn<bool>("duringCall");
-    QTest::addColumn<bool>("connectedFirst");
+    QTest::addColumn<bool>("connectionFirst"); // the call connects (or the connected one ends)
 
     QTest::addRow("answered on the handset, connected first") << false << true;
     QTest::addRow("answered on the handset, ringing ended first") << false << false;
     QTest::addRow("waiting call ends") << true << false;
+    QTest::addRow("connected call ends, then the waiting call") << true << true;
 }
 
 // However the ringing ends, and in whichever order the phone reports it, no call popup stays.
 void TestCallReactions::ringingEnds()
 {
     QFETCH(bool, duringCall);
-    QFETCH(bool, connectedFirst);
+    QFETCH(bool, connectionFirst);
     phone()->setCallConnected(duringCall);
     QVERIFY(m_hmi->run());
     phone()->setIncomingCall(true);
@@ -185,9 +186,9 @@ void TestCallReactions::ringingEnds()
     QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
                                         : QStringLiteral("IncomingCall")));
 
-    for (const bool connectNow : {connectedFirst, !connectedFirst}) {
-        if (connectNow)
-            phone()->setCallConnected(true);
+    for (const bool connectionNow : {connectionFirst, !connectionFirst}) {
+        if (connectionNow)
+            phone()->setCallConnected(!duringCall);
         else
             phone()->setIncomingCall(false);
         TestSupport::processUntilIdle();
@@ -339,8 +340,7 @@ void TestCallReactions::roamingConfirmation()
     phone()->setOutboundRoamingRecentCallIndex(5);
     QVERIFY(m_hmi->run());
 
-    const qint64 since = GlobalHmi::mark();
-    GlobalHmi::post(Events::HmiPhone_ConfirmRoamingCall);
+    const qint64 since = GlobalHmi::post(Events::HmiPhone_ConfirmRoamingCall);
     const auto entries = Platform::Journal::instance()->entriesSince(since);
     QVERIFY(!entries.isEmpty());
     QCOMPARE(entries.first().fields.value(QStringLiteral("call")).toString(), command);
@@ -392,7 +392,15 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
 namespace {
 
 enum Situation { Idle, Ringing, Waiting, OneCall, TwoCalls, Dialling };
-enum Condition { Private = 1, Blocked = 2, Projection = 4, Rendering = 8, DoNotDisturb = 16 };
+// Covered: another popup comes up over the call popup before the key.
+enum Condition {
+    Private = 1,
+    Blocked = 2,
+    Projection = 4,
+    Rendering = 8,
+    DoNotDisturb = 16,
+    Covered = 32
+};
 
 } // namespace
 
@@ -484,6 +492,8 @@ void TestCallReactions::keys_data()
     row("waiting: 91 short", Waiting, 0, 91, 2, rejected + closeWaiting + rejectEvent);
     row("waiting, rendering: send short", Waiting, Rendering, 49, 2, closeWaiting);
     row("waiting, rendering: 77", Waiting, Rendering, 77, 1, {});
+    row("waiting, covered: phone key", Waiting, Covered, 12, 2, accepted + closeWaiting);
+    row("waiting, covered: 78", Waiting, Covered, 78, 1, rejectWaiting + closeWaiting);
     row("waiting, blocked: end", Waiting, Blocked, 50, 1, {});
     row("one call: phone key", OneCall, 0, 12, 2, {});
     row("one call: phone key long ends", OneCall, 0, 12, 3, endCall);
@@ -547,6 +557,11 @@ void TestCallReactions::keys()
     if (situation == Ringing || situation == Waiting) {
         phone()->setIncomingCall(true);
         TestSupport::processUntilIdle();
+    }
+    if (conditions & Covered) {
+        emit phone()->phoneRoamingModeReceived();
+        TestSupport::processUntilIdle();
+        QVERIFY(GlobalHmi::shown(QStringLiteral("RoamingWarning")));
     }
 
     const qint64 since = GlobalHmi::mark();

@@ -8,9 +8,11 @@
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
 #include <quorvel/hmilayeredstate.h>
+#include <quorvel/hmistate.h>
 #include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
+#include <taldris/hmisubmoduleprovider.h>
 
 #include <QQmlContext>
 #include <QQmlEngine>
@@ -30,13 +32,14 @@ static QStringList tree(const QState *state, const QStringList &descend, const Q
     QStringList names;
     auto *layered = qobject_cast<const Quorvel::HmiLayeredState *>(state);
     QObjectList children = (layered ? layered->exclusiveState() : state)->children();
-    if (layered)
-        children += layered->layerState()->children();
+    if (layered) // each popup of the layer sits in a slot of its own
+        for (const QObject *slot : layered->layerState()->children())
+            for (QObject *popup :
+                 slot->findChildren<Quorvel::PopupState *>(QString(), Qt::FindDirectChildrenOnly))
+                children.append(popup);
     for (const QObject *child : children) {
         auto *childState = qobject_cast<const QState *>(child);
-        if (!childState
-            || (layered && child->parent() == layered->layerState()
-                && !qobject_cast<const Quorvel::PopupState *>(child)))
+        if (!childState)
             continue;
         names.append(prefix + child->objectName());
         if (descend.contains(child->objectName()))
@@ -146,6 +149,16 @@ private slots:
             QVERIFY(!Taldris::HmiIntentManager::instance()->requestAction(
                     1, {QStringLiteral("0123")}));
         }) << QStringLiteral("HmiPhoneIntentHandler: the controller is gone, no call placed");
+        QTest::newRow("settings pages built again")
+                << std::function<void()>([] {
+                       Quorvel::HmiState settings(QStringLiteral("SETTINGS"));
+                       settings.setInitialHmiState(
+                               new Quorvel::HmiState(QStringLiteral("MENU"), &settings));
+                       QVERIFY(Taldris::HmiSubmoduleProvider::instance()->requestSubmodule(
+                               3, &settings, QStringLiteral("SETTINGS"), 0));
+                   })
+                << QStringLiteral("HmiPhoneSettingsHostedSubmodule: the controller is gone, the "
+                                  "settings pages cannot stop a ringtone sample");
         QTest::newRow("low battery guard") << std::function<void()>([] {
             Mavrosk::PhoneSource::instance()->setBridgeValue(
                     QStringLiteral("lowBatteryNotification"), true);

@@ -114,7 +114,7 @@ private slots:
             else if (step == QLatin1String("notification on"))
                 setValues(QStringLiteral("phone.messageNotificationEnabled=true"));
             else
-                ScreenFixture::post(step);
+                since = ScreenFixture::post(step);
             TestSupport::processUntilIdle();
         }
         QVERIFY2(ScreenFixture::activeStates().contains(expected), qPrintable(expected));
@@ -166,11 +166,11 @@ private slots:
 
         Phone_Cmp *phone = build(data);
         enter(phone);
-        const qint64 since = ScreenFixture::mark();
+        qint64 since = ScreenFixture::mark();
         if (request == QLatin1String("makeCall"))
             phone->makeCall();
         else
-            ScreenFixture::post(request);
+            since = ScreenFixture::post(request);
         QCOMPARE(PhoneRootFixture::outputs(since).join(QLatin1String("; ")), outputs);
         // The do-not-disturb popup belongs to the phone's own layer and shows while the phone does.
         if (outputs.endsWith(Views::PhoneDndActiveArdel))

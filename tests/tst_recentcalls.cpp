@@ -17,25 +17,6 @@ using namespace ScreenFixture;
 
 namespace {
 
-const QEvent::Type KeepListTypeEvent = static_cast<QEvent::Type>(1263);
-
-// Enters its target on a framework event of one type.
-class EventTypeTransition : public QAbstractTransition
-{
-public:
-    EventTypeTransition(QEvent::Type type, QState *source)
-        : QAbstractTransition(source)
-        , m_type(type)
-    { }
-
-protected:
-    bool eventTest(QEvent *event) override { return event->type() == m_type; }
-    void onTransition(QEvent *) override { }
-
-private:
-    QEvent::Type m_type;
-};
-
 // The popups on screen (without "PHONE.RecentCalls") and the phone's commands since `since`.
 QString screen(qint64 since)
 {
@@ -73,12 +54,12 @@ private slots:
         QTest::addRow("retry error") << 5 << false << "RetryError setCurrentRecentCallListType(0)";
         QTest::addRow("failed") << 6 << false << "DownloadFailed setCurrentRecentCallListType(0)";
         QTest::addRow("failed, status 0: no popup") << 0 << false << "setCurrentRecentCallListType(0)";
-        QTest::addRow("entered by event 1263") << 1 << true << "downloadRecentCallsList()";
+        QTest::addRow("returned to by back") << 1 << true << "downloadRecentCallsList()";
         // clang-format on
     }
 
-    // Each entry shows the popup of the status, resets the list type (unless entered by an event of
-    // type 1263) and downloads the list when it is available.
+    // Each entry shows the popup of the status, resets the list type (unless the driver comes back
+    // to the screen) and downloads the list when it is available.
     void entry()
     {
         QFETCH(int, status);
@@ -86,10 +67,16 @@ private slots:
         QFETCH(QString, screen);
 
         start(QStringLiteral("currentRecentCallListType=2 recentCallListStatus=%1").arg(status));
+        if (keepType) { // the driver opens the recent calls, then the menu
+            post(QStringLiteral("Recent"));
+            post(QStringLiteral("Menu"));
+        }
         const qint64 since = mark();
         if (keepType)
-            Quorvel::StateMachine::instance()->postEvent(new QEvent(KeepListTypeEvent));
-        post(keepType ? QStringLiteral("None") : QStringLiteral("Recent"));
+            Brisken::ViewController::instance()->back();
+        else
+            post(QStringLiteral("Recent"));
+        TestSupport::processUntilIdle();
 
         QCOMPARE(Brisken::ViewController::instance()->activeView(), Views::RecentCalls);
         QCOMPARE(::screen(since), screen);
@@ -180,7 +167,7 @@ private slots:
 
 private:
     // The menu and the recent calls under the phone's root stand-in, built as the root component
-    // builds them; "Recent" and an event of type 1263 open the recent calls, "Menu" the menu.
+    // builds them; "Recent" opens the recent calls, "Menu" the menu.
     void start(const QString &values = QString())
     {
         Quorvel::HmiState *parent = buildRoot();
@@ -194,9 +181,6 @@ private:
         parent->setInitialHmiState(m_menu);
         addOpener(QStringLiteral("Recent"), m_recentCalls);
         addOpener(QStringLiteral("Menu"), m_menu);
-        (new EventTypeTransition(KeepListTypeEvent,
-                                 Quorvel::StateMachine::instance()->screensState()))
-                ->setTargetState(m_recentCalls);
         ScreenFixture::start();
     }
 

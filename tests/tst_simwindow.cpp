@@ -43,11 +43,12 @@ QQuickItem *findItem(QQuickItem *item, const QString &name)
     return nullptr;
 }
 
-// The popups the display draws, by view name, bottom first.
+// The popups the display draws in front (not covered), by view name.
 QStringList drawnPopups(QQuickItem *item)
 {
     QStringList names;
-    if (item->isVisible() && item->objectName().startsWith(QLatin1String("popup:")))
+    if (item->isVisible() && item->objectName().startsWith(QLatin1String("popup:"))
+        && item->property("isTop").toBool())
         names.append(item->objectName().mid(6));
     for (QQuickItem *child : item->childItems())
         names += drawnPopups(child);

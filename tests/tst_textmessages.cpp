@@ -68,7 +68,10 @@ private slots:
         }
         emit source()->textMessageDetailsReady();
         TestSupport::processUntilIdle();
-        QCOMPARE(PhoneRootFixture::outputs(since), outputs);
+        // The selections posted are in the journal too: compare what they caused.
+        QCOMPARE(PhoneRootFixture::outputs(since).filter(
+                         QRegularExpression(QStringLiteral("^(?!event )"))),
+                 outputs);
         QVERIFY(ScreenFixture::activeStates().contains(screen));
 
         // Reading aloud is asked once: details arriving again open the message; details arriving

@@ -242,6 +242,85 @@ private slots:
         QCOMPARE(controller->shownPopups(), shown);
     }
 
+    // Popup A (with the child states A1 and A2) open, B of the same priority covers it; then one
+    // operation: "step" fires A1 -> A2, "leave" fires A -> the screen "Menu", "wait" lets A's
+    // auto-dismiss run out, "+X"/"-X" request/dismiss. A covered popup stays an active state.
+    void coveredPopup_data()
+    {
+        QTest::addColumn<QStringList>("operations");
+        QTest::addColumn<QStringList>("journal"); // popup-shown/hidden/closed since B covered A
+        QTest::addColumn<QStringList>("open");
+        QTest::addColumn<QString>("active");
+        QTest::addColumn<int>("exitsOfA");
+        auto row = [](const char *tag, const char *operations, const char *journal,
+                      const char *open, const char *active, int exits) {
+            QTest::addRow("%s", tag) << words(operations) << words(journal) << ids(words(open))
+                                     << QString::fromLatin1(active) << exits;
+        };
+        // clang-format off
+        row("covered: A stays open in its state", "", "", "A B", "A1", 0);
+        row("a transition from A to a screen closes only A", "leave", "popup-closed:T.A", "B", "Menu", 1);
+        row("A's child state is kept and listens", "step -B", "popup-hidden:T.B popup-shown:T.A", "A", "A2", 0);
+        row("A's auto-dismiss runs out while covered", "wait", "popup-closed:T.A", "B", "Home", 1);
+        row("A dismissed while covered", "-A", "popup-closed:T.A", "B", "Home", 1);
+        row("B dismissed: A shows again, not entered again", "-B", "popup-hidden:T.B popup-shown:T.A", "A", "A1", 0);
+        row("A requested again: moves up, not entered again", "+A", "popup-hidden:T.B popup-shown:T.A", "B A", "A1", 0);
+        // clang-format on
+    }
+    void coveredPopup()
+    {
+        QFETCH(QStringList, operations);
+        QFETCH(QStringList, journal);
+        QFETCH(QStringList, open);
+        QFETCH(QString, active);
+        QFETCH(int, exitsOfA);
+        Screens screens;
+        PopupState *a = screens.globalA;
+        auto *a1 = new HmiState(QStringLiteral("A1"), a);
+        (new HmiTransition(QStringLiteral("Step"), a1))
+                ->setTargetState(new HmiState(QStringLiteral("A2"), a));
+        a->setInitialState(a1);
+        (new HmiTransition(QStringLiteral("Leave"), a))->setTargetState(screens.menu);
+        a->setAutoDismissTimeoutActive(true);
+        a->setAutoDismissTimeoutInterval(operations.contains(QStringLiteral("wait")) ? 30 : 60000);
+        int entries = 0, exits = 0;
+        QObject::connect(a, &QState::entered, [&] { ++entries; });
+        QObject::connect(a, &QState::exited, [&] { ++exits; });
+        screens.start();
+        ViewController *controller = ViewController::instance();
+        controller->requestPopup(id("A"));
+        processUntilIdle();
+        controller->requestPopup(id("B"));
+        processUntilIdle();
+        const qint64 since = TestSupport::mark();
+
+        for (const QString &operation : operations) {
+            const QByteArray name = operation.mid(1).toLatin1();
+            if (operation == QLatin1String("wait"))
+                QTRY_VERIFY(!a->isActive());
+            else if (operation.startsWith(QLatin1Char('+')))
+                controller->requestPopup(id(name.constData()));
+            else if (operation.startsWith(QLatin1Char('-')))
+                controller->dismissPopup(id(name.constData()));
+            else
+                screens.machine->postEvent(
+                        new HmiEvent(operation.at(0).toUpper() + operation.mid(1)));
+            processUntilIdle();
+        }
+        QStringList popupLines;
+        for (const QString &line : TestSupport::journalLines(since,
+                                                             {QStringLiteral("popup-shown"),
+                                                              QStringLiteral("popup-hidden"),
+                                                              QStringLiteral("popup-closed")}))
+            popupLines << QString(line).replace(QLatin1Char(' '), QLatin1Char(':'));
+        QCOMPARE(popupLines, journal);
+        QCOMPARE(controller->openPopups(), open);
+        QCOMPARE(controller->shownPopups(), QStringList{open.last()});
+        QVERIFY2(NamedState::stateForName(active)->isActive(), qPrintable(active));
+        QCOMPARE(entries, 1);
+        QCOMPARE(exits, exitsOfA);
+    }
+
     // Requests and dismissals made by the transitions of one notification take effect after all
     // of them, in the order made; a registered dismissing transition closes at once.
     void requestsDuringOneNotification_data()

@@ -17,7 +17,7 @@ namespace Simulator {
 namespace {
 
 // Checks whose value is a name of what is on screen, not a value name.
-const char *const ScreenChecks[] = {"view", "popup", "nopopup", "state"};
+const char *const ScreenChecks[] = {"view", "popup", "nopopup", "top", "state"};
 
 QString compact(const QJsonObject &object)
 {
@@ -87,16 +87,22 @@ QString checkScreen(const QString &key, const QString &wanted, bool negated)
         return QStringLiteral("expected %1view %2, on screen: %3")
                 .arg(no, wanted, active.isEmpty() ? QStringLiteral("none") : active);
     }
-    if (key == QLatin1String("popup") || key == QLatin1String("nopopup")) {
-        const QStringList popups = Brisken::ViewController::instance()->shownPopups();
-        bool shown = false;
+    // "popup"/"nopopup": open, on top or covered; "top": shown on top of its region.
+    if (key == QLatin1String("popup") || key == QLatin1String("nopopup")
+        || key == QLatin1String("top")) {
+        const bool top = key == QLatin1String("top");
+        Brisken::ViewController *views = Brisken::ViewController::instance();
+        const QStringList popups = top ? views->shownPopups() : views->openPopups();
+        bool found = false;
         for (const QString &popup : popups)
-            shown = shown || namesMatch(popup, wanted);
-        const bool wantShown = (key == QLatin1String("popup")) != negated;
-        if (shown == wantShown)
+            found = found || namesMatch(popup, wanted);
+        const bool wanting = (key != QLatin1String("nopopup")) != negated;
+        if (found == wanting)
             return QString();
-        return QStringLiteral("expected %1popup %2, shown: %3")
-                .arg(wantShown ? QString() : QStringLiteral("no "), wanted,
+        return QStringLiteral("expected %1%2 %3, %4: %5")
+                .arg(wanting ? QString() : QStringLiteral("no "),
+                     top ? QStringLiteral("popup on top") : QStringLiteral("open popup"), wanted,
+                     top ? QStringLiteral("on top") : QStringLiteral("open"),
                      popups.isEmpty() ? QStringLiteral("none") : popups.join(QStringLiteral(", ")));
     }
     // "state": an active state of that object name; the message lists the active leaves.

@@ -15,7 +15,8 @@ struct ScenarioStep;
 
 // Judges a scenario's expectations against what the HMI shows now and what the module wrote
 // since the last input step:
-//   "view", "popup", "nopopup", "state": what is on screen and which states are active;
+//   "view", "popup", "nopopup", "top", "state": what is on screen (a popup is open, on top or
+//   covered; "top" is the popup shown on top of its region) and which states are active;
 //   a value name ("phone.status", "controller.isEmptyNumber", "host.transients"): its value;
 //   "out" with fields: an output of that kind written since the last input.
 // An "expect-not" step negates each of its checks.

@@ -272,7 +272,8 @@ int main(int argc, char *argv[])
     }
 
     QByteArray text;
-    QString scenarioName = QStringLiteral("stdin");
+    QString scenarioName
+            = display == Display::Window ? QStringLiteral("window") : QStringLiteral("stdin");
     if (!positional.isEmpty() && positional.first() != QLatin1String("-")) {
         scenarioName = positional.first();
         QFile file(scenarioName);

@@ -35,6 +35,26 @@ constexpr int Actions[] = {1, 7, 28, 32, 47, 56, 67, 68};
 constexpr int OddInts[]
         = {INT_MIN, INT_MIN + 1, -1000, -2, 13, 20, 99, 1000, 1000000, INT_MAX - 1, INT_MAX};
 
+// The bridge values most of the module's global transitions wait on: set more often than the
+// others, so that their combinations (a popup open while the next value comes) turn up.
+const char *const HotProperties[] = {
+        "phone.status",
+        "phone.incomingCall",
+        "phone.callConnected",
+        "phone.multipleCallsConnected",
+        "phone.currentExtendedMode",
+        "phone.extendedModeTimerValue",
+        "phone.phoneCallStandByMode",
+        "bluetooth.deviceConnected",
+        "phone.phoneBookStatus",
+        "phone.messagesDownloadingStatus",
+        "phone.sendMessageStatus",
+        "phone.privateMode",
+        "phone.dialingInProgress",
+        "phone.emergencyCallStatus",
+        "phone.recentCallListStatus",
+};
+
 QString line(const QJsonObject &step)
 {
     return QString::fromUtf8(QJsonDocument(step).toJson(QJsonDocument::Compact));
@@ -77,6 +97,13 @@ RandomSoak::RandomSoak(ScenarioRunner *runner, Invariants *invariants, quint32 s
                 m_signals.append({source->shortName() + QLatin1Char('.')
                                           + QString::fromLatin1(method.name()),
                                   parameterTypes(method)});
+        }
+    }
+
+    for (const Member &property : qAsConst(m_properties)) {
+        for (const char *hot : HotProperties) {
+            if (property.name == QLatin1String(hot))
+                m_hotProperties.append(property);
         }
     }
 
@@ -176,9 +203,12 @@ QJsonValue RandomSoak::valueOf(int type, bool wrong)
 
 QString RandomSoak::setBridgeValue()
 {
-    const Member &property = chance(97) || m_controllerProperties.isEmpty()
-            ? m_properties.at(pick(m_properties.size()))
-            : m_controllerProperties.at(pick(m_controllerProperties.size()));
+    const int which = pick(100);
+    const Member &property = which < 3 && !m_controllerProperties.isEmpty()
+            ? m_controllerProperties.at(pick(m_controllerProperties.size()))
+            : which < 45 && !m_hotProperties.isEmpty()
+            ? m_hotProperties.at(pick(m_hotProperties.size()))
+            : m_properties.at(pick(m_properties.size()));
     return line({{QStringLiteral("set"), property.name},
                  {QStringLiteral("value"), valueOf(property.types.first(), false)}});
 }

@@ -66,6 +66,7 @@ private:
     QList<Member> m_signals; // "phone.phoneDialingFailed" and its parameter types
     QList<Member> m_slots; // "acceptIncomingCall" and its parameter types
     QList<Member> m_controllerProperties;
+    QList<Member> m_hotProperties; // set more often
     QStringList m_events;
     qint64 m_played = 0;
     QString m_violation;

@@ -79,6 +79,11 @@ QStringList ViewController::shownPopups() const
     return Quorvel::StateMachine::instance()->shownPopups();
 }
 
+QStringList ViewController::openPopups() const
+{
+    return Quorvel::StateMachine::instance()->openPopups();
+}
+
 QStringList ViewController::backStack() const
 {
     return Quorvel::StateMachine::instance()->backStack();

@@ -20,7 +20,7 @@ public:
     // Shows the popup state of that name when one is installed and its layer is active; a
     // request for an identifier that no popup state carries is only recorded.
     void requestPopup(const QString &viewId, const QVariant &data = QVariant());
-    // Removes the popup from its stack wherever it is; the next one still requested shows.
+    // Closes the popup, on top or covered; the next one still open shows.
     void dismissPopup(const QString &viewId);
     // Enters the view state showing that view; for an identifier that no view state shows, the
     // state of that name (entered through its initial state). Anything else is only recorded.
@@ -31,7 +31,8 @@ public:
 
     // Queries for the host and tests.
     QString activeView() const; // the view identifier on screen, or empty
-    QStringList shownPopups() const;
+    QStringList shownPopups() const; // the popup on top of each active region
+    QStringList openPopups() const; // every popup open, on top or covered
     QStringList backStack() const; // view state names, bottom first
 
 private:

@@ -23,11 +23,13 @@ struct JournalEntry
 //   view {id}                 a view state was entered and its view is on screen
 //   view-request {id}         a view was requested directly from the view controller
 //   popup-request {id}        popup-dismiss {id}      what a module asked
-//   popup-shown {id}          popup-hidden {id}       what the framework did
+//   popup-shown {id}          popup-hidden {id}       what the framework did: the popup on top
+//                                                     of its region changed
+//   popup-closed {id}         a popup closed while covered by another
 //   transient {name, value}   transient-hide {name}
 //   back {steps}
 //   intent {action, args}     hardkey {call}
-//   event {name, value}       an event posted to the state machine
+//   event {name, value}       an event posted to the state machine, by whoever posted it
 //   bridge {call, args}       a command or module-side setter of the data bridge,
 //                             call as "<source>.<member>", e.g. "phone.acceptIncomingCall"
 class Journal : public QObject

@@ -15,9 +15,19 @@ class HmiLayeredState;
 
 // The state of a popup, named by its view identifier. A popup with a layer lives in that
 // layered state's layer region; one without joins the global popup region when the host
-// installs it. Popups are shown by the view controller's requests: popups of one region stack
-// by priority (a higher value lies above, the newest on top among equals), the top one is
-// entered, and dismissing it reveals the next one still requested.
+// installs it.
+//
+// A popup is open (an active state) from the moment a request for it is applied until it is
+// dismissed: by a dismissal request, by its auto-dismiss timeout, by a transition registered with
+// registerDismissingTransition (or PopupUtils::makeExclusive), by a popup registered with
+// registerDismissingPopup opening, or by a transition that leaves it. A transition from an open
+// popup (or one of its states) to a state outside it closes only that popup, and leaves only the
+// states below its target's deepest active ancestor, as an adopted transition does.
+//
+// Open popups of one region stack by priority (a higher value lies above, the newest on top
+// among equals); the top one is shown. Covering a popup changes only what is shown: the covered
+// popup is not left, keeps its child states, and its transitions keep listening. A request for
+// a popup already open only brings it to the top of its priority group.
 class PopupState : public HmiState
 {
     Q_OBJECT
@@ -32,17 +42,18 @@ public:
     // The data of the request that showed the popup.
     QVariant popupData() const;
 
-    // Auto-dismiss: while shown, the popup is dismissed when the interval (ms) has passed.
+    // Auto-dismiss: the popup is dismissed when the interval (ms) has passed since it opened,
+    // covered or not.
     void setAutoDismissTimeoutActive(bool active);
     bool autoDismissTimeoutActive() const;
     void setAutoDismissTimeoutInterval(int milliseconds);
     int autoDismissTimeoutInterval() const;
-    // Starts the interval again if the popup is shown.
+    // Starts the interval again if the popup is open.
     void restartAutoDismissTimer();
 
     // The popup is dismissed when `transition` fires (at once, as part of the firing).
     void registerDismissingTransition(QAbstractTransition *transition);
-    // The popup is dismissed when `popup` is shown.
+    // The popup is dismissed when `popup` opens.
     void registerDismissingPopup(PopupState *popup);
 
 protected:

@@ -28,6 +28,10 @@ class StateMachinePrivate;
 //                                                     "ScreensIdle")
 //                                                     '- "Popups"   the global popup region
 //
+// A popup region (the global one, and the layer of each layered state) is parallel: each popup
+// sits in a slot of its own ("<id>Slot", closed in "<id>Closed"), so every popup that is open is
+// an active state, on top or covered (see PopupState for when a popup opens and closes).
+//
 // Host side, in this order:
 //   1. add screens under screensState() (and setInitialHmiState() on it), hand it to modules;
 //   2. installRootHierarchy() with each module's two root-hierarchy lists;
@@ -44,6 +48,10 @@ class StateMachine : public QStateMachine
 public:
     using RootHierarchyTransitions = QList<QPair<StateLevel, QAbstractTransition *>>;
     using RootHierarchyPopupStates = QList<QPair<StateLevel, PopupState *>>;
+
+    // The type of the event with which back navigation (back(), direct back transitions) enters
+    // its target; any other entry comes with another event.
+    static constexpr QEvent::Type BackEventType = static_cast<QEvent::Type>(QEvent::User + 263);
 
     static StateMachine *instance();
     // The instance if one exists, without making one.
@@ -68,6 +76,12 @@ public:
     void installRootHierarchy(const RootHierarchyTransitions &transitions,
                               const RootHierarchyPopupStates &popups);
 
+    // Posts an event to the machine. Every HmiEvent posted, by whoever posts it, is journaled
+    // once as "event" {name, value} when posted. Events posted before the machine runs wait for
+    // it and are posted, in order, when it has started (Qt's own postEvent drops them); they are
+    // dropped with the machine if it is destroyed first.
+    void postEvent(QEvent *event, EventPriority priority = NormalPriority);
+
     // Popups, by view identifier (the view controller's requests end here).
     // Returns false when no popup state carries the identifier (nothing is entered then).
     // Requests and dismissals made while the transitions of one notification run take effect
@@ -77,6 +91,8 @@ public:
     PopupState *popupState(const QString &viewId) const;
     // The popups on screen (the top of each active popup region), in region creation order.
     QStringList shownPopups() const;
+    // The popups open, on top or covered: region by region in creation order, bottom first.
+    QStringList openPopups() const;
     // The popups requested and not dismissed in the region of `viewId`'s popup, bottom first.
     QStringList popupStack(const QString &viewId) const;
 

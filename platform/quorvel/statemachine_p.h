@@ -5,6 +5,7 @@
 
 #include <quorvel/statemachine.h>
 
+#include <QAbstractTransition>
 #include <QEvent>
 #include <QHash>
 #include <QPointer>
@@ -17,8 +18,12 @@ namespace Quorvel {
 class HmiAbstractTransition;
 class HmiViewState;
 class NamedState;
+class PopupRegion;
 class PopupState;
 class StateMachinePrivate;
+
+// The framework's own events. Each is posted at high priority, so it is handled before any
+// module event still waiting.
 
 // Asks one transition to fire, as its turn in the fan-out of one notification.
 class FireEvent : public QEvent
@@ -32,18 +37,85 @@ public:
     QVariant data;
 };
 
-// A popup region: the framework enters the top popup of its stack, or its idle state.
+// Closes the fan-out of one notification: the popup requests and dismissals that its
+// transitions made take effect now.
+class BatchEndEvent : public QEvent
+{
+public:
+    explicit BatchEndEvent(quint64 batch);
+    static QEvent::Type eventType();
+
+    quint64 batch;
+};
+
+// Moves the machine to a state (navigation). A move made by back navigation has the type
+// StateMachine::BackEventType, so that the states entered can tell a return from a fresh entry.
+class RouteEvent : public QEvent
+{
+public:
+    RouteEvent(QAbstractState *target, QEvent::Type type);
+    static QEvent::Type eventType();
+
+    QPointer<QAbstractState> target;
+};
+
+// Opens and closes the popups of one region as its stack says.
+class PopupSyncEvent : public QEvent
+{
+public:
+    explicit PopupSyncEvent(PopupRegion *region);
+    static QEvent::Type eventType();
+
+    QPointer<PopupRegion> region;
+};
+
+// A framework transition that the machine takes for one event only: the event it is armed with.
+class ArmedTransition : public QAbstractTransition
+{
+public:
+    ArmedTransition(const QString &name, QState *source);
+    void arm(QEvent *event, QAbstractState *target);
+    void disarm() { m_armed = nullptr; }
+    bool isArmed() const { return m_armed; }
+
+protected:
+    bool eventTest(QEvent *event) override { return m_armed && event == m_armed; }
+    void onTransition(QEvent *) override { }
+
+private:
+    QEvent *m_armed = nullptr;
+};
+
+// A popup region: a parallel state with one slot per popup, so that every open popup is an active
+// state whether it is on top or covered. The stack orders the open popups by priority; its top
+// is the one shown.
 class PopupRegion : public QState
 {
 public:
     PopupRegion(const QString &name, QState *parent);
-    QState *idleState() const { return m_idle; }
 
-protected:
-    void onExit(QEvent *event) override;
+    // The popups open or about to open (requested and not dismissed), bottom first.
+    QList<QPointer<PopupState>> stack;
+    // The popup last reported on top ("popup-shown"), until it is reported hidden.
+    QPointer<PopupState> shown;
+    bool syncPending = false;
+};
+
+// One popup's place in its region: closed, or the popup open. The framework opens and closes the
+// popup with the slot's own armed transition, which leaves nothing outside the slot.
+class PopupSlot : public QState
+{
+public:
+    PopupSlot(PopupState *popup, PopupRegion *region);
+    PopupState *popup() const { return m_popup; }
+    PopupRegion *region() const { return static_cast<PopupRegion *>(parentState()); }
+    QState *closedState() const { return m_closed; }
+    ArmedTransition *mover() const { return m_mover; }
 
 private:
-    QState *m_idle;
+    PopupState *m_popup;
+    QState *m_closed;
+    ArmedTransition *m_mover;
 };
 
 // Forwards each emission of one signal of one sender to the dispatcher, with its arguments.
@@ -71,10 +143,17 @@ public:
     static StateMachinePrivate *existing();
 
     void build();
-    PopupRegion *createPopupRegion(const QString &name, QState *parent);
     bool isActive(const QAbstractState *state) const;
+    // The deepest active exclusive ancestor of `target`: a transition placed there leaves only
+    // what lies below it before entering `target`.
+    QState *domainFor(QAbstractState *target) const;
 
-    // Transitions: trigger index and fan-out.
+    // Posting (statemachine.cpp): every HmiEvent is journaled when posted; events posted before
+    // the machine runs wait for it.
+    void post(QEvent *event, QStateMachine::EventPriority priority);
+    void postHeld();
+
+    // Notifications and their fan-out (fanout.cpp).
     quint64 nextSequence() { return ++m_sequence; }
     void listenToEvent(HmiAbstractTransition *transition, const QString &eventName);
     bool listenToSignal(HmiAbstractTransition *transition, const QObject *sender, int signalIndex);
@@ -83,20 +162,31 @@ public:
     void notify(const QVector<HmiAbstractTransition *> &listeners, const QVariantList &arguments,
                 QEvent *testEvent);
     void beginSelect(QEvent *event);
-    void endMicrostep(QEvent *event);
-    QState *domainFor(QAbstractState *target) const;
+    void endMicrostep();
+
+    // The turn of one fired transition (adoption.cpp): adopted ones and those that leave an open
+    // popup are moved for that turn only.
+    void placeForTurn(HmiAbstractTransition *transition, QEvent *fire);
+    void moveForTurn(HmiAbstractTransition *transition, QState *domain);
+    void parkMovedTransition();
 
     // Names.
     void registerName(NamedState *state, const QString &name);
     void forgetName(NamedState *state);
     NamedState *stateForName(const QString &name) const;
 
-    // Views and back stack.
+    // Views and back stack (backstack.cpp).
     void viewEntered(HmiViewState *view);
     void viewExited(HmiViewState *view);
     bool back(int steps);
+    void goToState(QAbstractState *target, QEvent::Type type = QEvent::None);
+    void route(QEvent *event, QAbstractState *target);
 
-    // Popups.
+    // Popups (popupregions.cpp).
+    PopupRegion *createPopupRegion(const QString &name, QState *parent);
+    void placeInRegion(PopupState *popup, PopupRegion *region);
+    static PopupSlot *slotOf(const PopupState *popup);
+    static PopupRegion *regionOf(const PopupState *popup);
     void registerPopup(PopupState *popup);
     void forgetPopup(PopupState *popup);
     PopupState *popupFor(const QString &viewId) const;
@@ -105,10 +195,12 @@ public:
     void dismissPopupNow(PopupState *popup);
     void popupEntered(PopupState *popup);
     void popupExited(PopupState *popup);
-    void regionExited(PopupRegion *region);
     void scheduleSync(PopupRegion *region);
-
-    void goToState(QAbstractState *target);
+    void syncRegion(PopupRegion *region, QEvent *event);
+    void markTopToReport(PopupRegion *region);
+    void reportTop(PopupRegion *region);
+    void reportTops();
+    QStringList openPopups() const;
 
     struct PopupOp
     {
@@ -123,6 +215,7 @@ public:
     HmiState *levels[3] = {nullptr, nullptr, nullptr};
     HmiState *screens = nullptr;
     PopupRegion *popups = nullptr;
+    QList<QEvent *> held; // posted before the machine ran, in posting order
 
     quint64 m_sequence = 0;
     QHash<QString, QVector<HmiAbstractTransition *>> eventListeners;
@@ -130,14 +223,13 @@ public:
     QHash<QString, QVector<NamedState *>> names;
 
     QPointer<HmiViewState> activeView;
-    QString lastKnownView;
+    QString lastKnownView; // the name of the view state shown before the current one
     QList<QPointer<HmiViewState>> backStack;
 
     QHash<QString, QVector<PopupState *>> popupsById;
     QVector<PopupRegion *> regions; // creation order
-    QHash<PopupRegion *, QList<QPointer<PopupState>>> stacks;
-    QSet<PopupRegion *> syncPending;
-    PopupRegion *syncingRegion = nullptr;
+    QVector<PopupRegion *> topsToReport; // regions whose top may have changed, in that order
+    QVector<PopupSlot *> armedSlots;
 
     quint64 m_batch = 0;
     quint64 currentBatch = 0;
@@ -145,13 +237,14 @@ public:
     QList<PopupOp> microstepOps;
     bool inMicrostep = false;
 
-    QAbstractTransition *router = nullptr;
+    ArmedTransition *router = nullptr;
     // Adopted framework transitions wait on this never-active state, so that the machine does
     // not look at them for other notifications; each is moved to its level (or to its target's
-    // domain) for its own turn only.
+    // domain) for its own turn only, as is a transition that leaves an open popup.
     QState *adoptedHolder = nullptr;
     QPointer<HmiAbstractTransition> movedTransition;
-    void parkMovedTransition();
+    QPointer<QState> movedFrom;
+    QAbstractTransition::TransitionType movedType = QAbstractTransition::ExternalTransition;
 };
 
 } // namespace Quorvel

@@ -17,8 +17,8 @@ namespace {
 bool changesScreen(const QString &kind)
 {
     return kind == QLatin1String("view") || kind == QLatin1String("popup-shown")
-            || kind == QLatin1String("popup-hidden") || kind == QLatin1String("transient")
-            || kind == QLatin1String("transient-hide");
+            || kind == QLatin1String("popup-hidden") || kind == QLatin1String("popup-closed")
+            || kind == QLatin1String("transient") || kind == QLatin1String("transient-hide");
 }
 
 QString nameOf(const QString &viewId)
@@ -28,20 +28,20 @@ QString nameOf(const QString &viewId)
 
 } // namespace
 
-HeadUnitScreen::HeadUnitScreen(VirtualEventDispatcher *clock, QObject *parent)
+HeadUnitScreen::HeadUnitScreen(VirtualEventDispatcher *clock, bool ticking, QObject *parent)
     : QObject(parent)
     , m_clock(clock)
-    , m_tick(new QTimer(this))
 {
     connect(Platform::Journal::instance(), &Platform::Journal::appended, this,
             [this](const Platform::JournalEntry &entry) {
                 if (changesScreen(entry.kind))
                     refresh();
             });
-    // On the virtual clock nothing moves between steps; in real time the clock ticks.
-    m_tick->setInterval(1000);
-    connect(m_tick, &QTimer::timeout, this, &HeadUnitScreen::refresh);
-    m_tick->start();
+    if (ticking) {
+        auto *tick = new QTimer(this);
+        connect(tick, &QTimer::timeout, this, &HeadUnitScreen::refresh);
+        tick->start(1000);
+    }
 }
 
 HeadUnitScreen::~HeadUnitScreen() = default;

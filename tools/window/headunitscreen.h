@@ -5,8 +5,6 @@
 #include <QStringList>
 #include <QVariantList>
 
-class QTimer;
-
 namespace Simulator {
 
 class VirtualEventDispatcher;
@@ -25,7 +23,9 @@ class HeadUnitScreen : public QObject
     Q_PROPERTY(qint64 time READ time NOTIFY timeChanged)
 
 public:
-    explicit HeadUnitScreen(VirtualEventDispatcher *clock, QObject *parent = nullptr);
+    // `ticking`: the clock runs in real time and the screen reads it every second; on the
+    // virtual clock it is read after each step.
+    HeadUnitScreen(VirtualEventDispatcher *clock, bool ticking, QObject *parent = nullptr);
     ~HeadUnitScreen() override;
 
     QString view() const { return m_view; }
@@ -43,7 +43,6 @@ signals:
 
 private:
     VirtualEventDispatcher *m_clock;
-    QTimer *m_tick;
     QString m_view;
     QVariantList m_popups;
     QStringList m_transients;

@@ -35,8 +35,10 @@ const char *const ExportedNames[] = {"_hmiphone", "_hmiphoneController"};
 
 QCoreApplication *HeadUnitWindow::createApplication(int &argc, char **argv, Mode mode)
 {
+    // Off screen: Qt's minimal platform with its fonts, which needs no display (and, unlike the
+    // offscreen platform, leaves nothing behind when the application ends).
     if (mode == OffScreen)
-        qputenv("QT_QPA_PLATFORM", "offscreen");
+        qputenv("QT_QPA_PLATFORM", "minimal:enable_fonts");
     // Flat pages need no graphics stack; the software renderer draws the same on every machine.
     QQuickWindow::setSceneGraphBackend(QSGRendererInterface::Software);
     return new QGuiApplication(argc, argv);
@@ -46,7 +48,7 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
                                VirtualEventDispatcher *clock, ScenarioPlayer::PlayStep playStep,
                                Mode mode, QObject *parent)
     : QObject(parent)
-    , m_screen(new HeadUnitScreen(clock, this))
+    , m_screen(new HeadUnitScreen(clock, mode == OnScreen, this))
     , m_player(new ScenarioPlayer(std::move(playStep), mode == OnScreen, this))
     , m_trace(new QStringListModel(this))
 {
@@ -98,6 +100,8 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
 HeadUnitWindow::~HeadUnitWindow()
 {
     delete m_root;
+    // The render control releases the scene graph it drew, before its window goes.
+    delete m_renderControl;
     delete m_window;
 }
 

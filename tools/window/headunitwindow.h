@@ -29,8 +29,8 @@ class HeadUnitWindow : public QObject
 public:
     enum Mode { OnScreen, OffScreen };
 
-    // The application a window needs; off screen it draws with the offscreen platform and
-    // Qt Quick's software renderer, without a display.
+    // The application a window needs; off screen it draws without a display, with Qt Quick's
+    // software renderer.
     static QCoreApplication *createApplication(int &argc, char **argv, Mode mode);
 
     // `engine` is the one the module exports its objects to.

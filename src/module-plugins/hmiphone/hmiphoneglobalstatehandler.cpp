@@ -633,8 +633,9 @@ void HmiPhoneGlobalStateHandler::incomingCall()
 // while a call is connected.
 void HmiPhoneGlobalStateHandler::incomingCallOutbound()
 {
-    if (m_phoneSource->callConnected())
-        m_popupManager->dismissWaitingCall();
+    // Whatever ended the ringing, neither call popup stays: the call the waiting call waited on
+    // may have ended first.
+    m_popupManager->dismissWaitingCall();
     m_popupManager->dismissIncomingCall();
 }
 

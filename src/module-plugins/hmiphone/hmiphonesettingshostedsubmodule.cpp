@@ -1,5 +1,7 @@
 #include "hmiphonesettingshostedsubmodule.h"
 
+#include "hmiphonecontroller.h"
+#include "hmiphoneintegration.h"
 #include "hmiphonesettingsstate.h"
 
 #include <brisken/hmiaction.h>
@@ -52,7 +54,10 @@ QString HmiPhoneSettingsHostedSubmodule::viewDescriptorFile() const
 
 Quorvel::HmiState *HmiPhoneSettingsHostedSubmodule::createStateHierarchy(Quorvel::HmiState *parent)
 {
-    return new HmiPhoneSettingsState(m_controller, parent);
+    if (!m_controller)
+        qCWarning(hmiphone) << "HmiPhoneSettingsHostedSubmodule: the controller is gone, the "
+                               "settings pages cannot stop a ringtone sample";
+    return new HmiPhoneSettingsState(m_controller.data(), parent);
 }
 
 } // namespace HmiPhone

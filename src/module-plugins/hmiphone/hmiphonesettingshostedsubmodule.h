@@ -2,6 +2,8 @@
 
 #include <taldris/hmihostedsubmodule.h>
 
+#include <QPointer>
+
 namespace HmiPhone {
 
 class HmiPhoneController;
@@ -23,7 +25,7 @@ public:
     Quorvel::HmiState *createStateHierarchy(Quorvel::HmiState *parent) override;
 
 private:
-    HmiPhoneController *m_controller;
+    QPointer<HmiPhoneController> m_controller; // QML can delete it (deleteLater())
 };
 
 } // namespace HmiPhone

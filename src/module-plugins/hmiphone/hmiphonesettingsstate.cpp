@@ -91,7 +91,9 @@ HmiPhoneSettingsState::HmiPhoneSettingsState(HmiPhoneController *controller,
     ringtone->setHandlesBackEvent(true);
     addPageRequest(this, Events::HmiPhone_RequestPhoneRingtoneSettingsPage, ringtone);
     // A ringtone preview never outlives its page, whichever way the page is left.
-    connect(ringtone, &QAbstractState::exited, controller, &HmiPhoneController::stopPlayRingtone);
+    if (controller)
+        connect(ringtone, &QAbstractState::exited, controller,
+                &HmiPhoneController::stopPlayRingtone);
 
     auto *textMessageNotification
             = new Quorvel::HmiViewState(Views::PhoneTextMessageNotificationSettings, this);

@@ -34,16 +34,17 @@ Item {
             border.width: 2
             opacity: isTop ? 1 : 0.6
 
+            // A covered popup keeps its title in the strip that shows above the one over it.
             Text {
                 anchors.horizontalCenter: parent.horizontalCenter
-                y: 56
+                y: card.isTop ? 56 : 4
                 width: parent.width - 64
-                horizontalAlignment: Text.AlignHCenter
+                horizontalAlignment: card.isTop ? Text.AlignHCenter : Text.AlignLeft
                 wrapMode: Text.Wrap
                 text: Views.title(modelData.name)
                 color: Theme.text
                 font.family: Theme.font
-                font.pixelSize: 38
+                font.pixelSize: card.isTop ? 38 : 24
             }
             Text {
                 anchors.right: parent.right
@@ -58,11 +59,12 @@ Item {
                 anchors.horizontalCenter: parent.horizontalCenter
                 anchors.bottom: parent.bottom
                 anchors.bottomMargin: 48
-                spacing: 20
+                spacing: 16
                 enabled: card.isTop
                 Repeater {
                     model: card.popupActions
                     Button {
+                        width: Math.min(implicitWidth, (card.width - 48) / card.popupActions.length - 16)
                         text: modelData[0]
                         slot: modelData[1]
                         tint: modelData[1].indexOf("accept") === 0 ? Theme.accept

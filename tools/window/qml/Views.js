@@ -15,8 +15,8 @@ function isPhoneView(viewId) {
 
 // "PhoneBookDownloadFailed" -> "Phone book download failed"
 function title(name) {
-    var words = name.replace(/^Phone(?=[A-Z])/, "").replace(/Popup$/, "")
-                    .replace(/([a-z0-9])([A-Z])/g, "$1 $2").replace(/([A-Z]+)([A-Z][a-z])/g, "$1 $2");
+    var words = name.replace(/Popup$/, "")
+                    .replace(/([a-z0-9])([A-Z])/g, "$1 $2").replace(/([a-z])([0-9])/g, "$1 $2").replace(/([A-Z]+)([A-Z][a-z])/g, "$1 $2");
     return words.charAt(0).toUpperCase() + words.slice(1).toLowerCase()
                 .replace(/\bsms\b/g, "text message").replace(/\bkova\b/g, "KOVA")
                 .replace(/\bdtmf\b/g, "DTMF").replace(/\bsiri\b/g, "Siri");

@@ -1,12 +1,12 @@
 import QtQuick 2.15
 import ".."
 
-// Nothing on screen yet: the HMI has not started.
+// No view on screen: the HMI has not started, or no view state is active.
 Page {
     title: ""
     Text {
         anchors.centerIn: parent
-        text: "Starting\u2026"
+        text: "No view"
         color: Theme.dim
         font.family: Theme.font
         font.pixelSize: 28

@@ -67,10 +67,13 @@ Page {
         height: parent.height
         clip: true
         model: phone.smsReplyMessages
+        // A reply text is a string or a row with its "text".
         delegate: ListRow {
+            readonly property string reply: typeof modelData === "string" ? modelData
+                                                                          : modelData.text || ""
             width: ListView.view.width
-            text: modelData
-            detail: index === phone.replyMessageLineNo ? "selected" : ""
+            text: reply
+            detail: reply === phone.replyTextSelected ? "selected" : ""
             onClicked: _hmiphoneController.hearSelectedReplyMessage()
         }
     }
