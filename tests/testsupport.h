@@ -9,16 +9,18 @@
 #include <quorvel/statemachine.h>
 
 #include <QCoreApplication>
+#include <QRegularExpression>
 #include <QStringList>
 #include <QTest>
-#include <QTimer>
 
 namespace TestSupport {
 
-// Start and posted events are asynchronous: process until nothing is left to do.
+// Start and posted events are asynchronous: process until nothing is left to do. A machine that
+// never settles fails the test.
 inline void processUntilIdle()
 {
-    Host::processUntilIdle();
+    QTest::qVerify(Host::processUntilIdle(), "Host::processUntilIdle()", "the machine settles",
+                   __FILE__, __LINE__);
 }
 
 inline qint64 mark()
@@ -93,20 +95,26 @@ inline QStringList bridgeCommandsSince(qint64 since)
     return journalLines(since, {QStringLiteral("bridge")});
 }
 
-// Records the warnings of Qt's state machine and fails the running test in cleanup(); a test that
-// expects one takes it with take() itself.
+// Fails the running test on an unexpected framework or Qt warning: the warnings and critical
+// messages of the platform's own categories ("orvane.*" but the module's), and Qt's warnings about
+// state machines, transitions and connections. Installed in front of QtTest's handler (to which
+// it passes every message on) by the Suite fixture before each test.
 class FrameworkWarningGuard
 {
 public:
-    FrameworkWarningGuard()
+    static void install()
     {
-        s_original = s_previous = qInstallMessageHandler(&FrameworkWarningGuard::handle);
-        // QtTest puts its own handler in front when the run starts and passes nothing on: take
-        // the front place again once the run has begun (before any posted event is handled).
-        QTimer::singleShot(0, [] { s_previous = qInstallMessageHandler(&handle); });
+        const QtMessageHandler previous = qInstallMessageHandler(&handle);
+        if (previous != &handle)
+            s_previous = previous;
+        take();
+        expected().clear();
     }
-    ~FrameworkWarningGuard() { qInstallMessageHandler(s_original); }
-
+    // A watched message the test expects: it is not recorded (once per call).
+    static void expect(QtMsgType type, const QRegularExpression &pattern)
+    {
+        expected().append({type, pattern});
+    }
     // Returns the recorded warnings and forgets them.
     static QStringList take()
     {
@@ -116,35 +124,93 @@ public:
     }
 
 private:
+    struct Expected
+    {
+        QtMsgType type;
+        QRegularExpression pattern;
+    };
     static QStringList &warnings()
     {
         static QStringList list;
         return list;
     }
+    static QList<Expected> &expected()
+    {
+        static QList<Expected> list;
+        return list;
+    }
+    static bool watched(QtMsgType type, const QMessageLogContext &context, const QString &message)
+    {
+        if (type != QtWarningMsg && type != QtCriticalMsg)
+            return false;
+        const QLatin1String category(context.category ? context.category : "");
+        if (category.startsWith(QLatin1String("orvane."))
+            && category != QLatin1String("orvane.hmiphone"))
+            return true;
+        static const char *const qtWarnings[] = {"QStateMachine",         "QState::",
+                                                 "QSignalTransition",     "No such signal",
+                                                 "Missing initial state", "QObject::connect:",
+                                                 "without its transition"};
+        for (const char *text : qtWarnings) {
+            if (message.contains(QLatin1String(text)))
+                return true;
+        }
+        return false;
+    }
     static void handle(QtMsgType type, const QMessageLogContext &context, const QString &message)
     {
-        static bool forwarding = false;
-        if (forwarding) { // QtTest, after its run, hands the message back to the handler it
-                          // replaced
-            if (s_original)
-                s_original(type, context, message);
-            return;
+        if (watched(type, context, message)) {
+            int index = 0;
+            while (index < expected().size()
+                   && (expected().at(index).type != type
+                       || !expected().at(index).pattern.match(message).hasMatch()))
+                ++index;
+            if (index < expected().size())
+                expected().removeAt(index);
+            else
+                warnings().append(message);
         }
-        static const char *const watched[] = {"QStateMachine",         "QState::",
-                                              "QSignalTransition",     "No such signal",
-                                              "Missing initial state", "without its transition"};
-        if (type == QtWarningMsg)
-            for (const char *text : watched)
-                if (message.contains(QLatin1String(text))) {
-                    warnings().append(message);
-                    break;
-                }
-        forwarding = true;
         if (s_previous)
             s_previous(type, context, message);
-        forwarding = false;
     }
     static inline QtMessageHandler s_previous = nullptr;
-    static inline QtMessageHandler s_original = nullptr;
 };
+
+// The fixture of every suite: a test class derives from it and puts its own preparation and
+// tidying in setUp() and tearDown() (init() and cleanup() belong to the fixture). From the first
+// statement of each test the warning guard is in front of QtTest's handler; after the test's
+// tearDown() the guard's record must be empty.
+class Suite : public QObject
+{
+    Q_OBJECT
+protected:
+    virtual void setUp() { }
+    virtual void tearDown() { }
+    // A message the test expects: QtTest does not print it and the guard does not count it.
+    static void expectMessage(QtMsgType type, const QRegularExpression &pattern)
+    {
+        QTest::ignoreMessage(type, pattern);
+        FrameworkWarningGuard::expect(type, pattern);
+    }
+    static void expectMessage(QtMsgType type, const char *message)
+    {
+        expectMessage(type,
+                      QRegularExpression(QLatin1Char('^')
+                                         + QRegularExpression::escape(QLatin1String(message))
+                                         + QLatin1Char('$')));
+    }
+
+private slots:
+    void init()
+    {
+        FrameworkWarningGuard::install();
+        setUp();
+    }
+    void cleanup()
+    {
+        tearDown();
+        QCOMPARE(FrameworkWarningGuard::take(), QStringList());
+    }
+};
+
 } // namespace TestSupport

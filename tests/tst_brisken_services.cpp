@@ -75,11 +75,12 @@ struct Machine
 
 } // namespace
 
-class TestBriskenServices : public QObject
+class TestBriskenServices : public TestSupport::Suite
 {
     Q_OBJECT
+protected:
+    void tearDown() override { DataStore::reset(); }
 private slots:
-    void cleanup() { DataStore::reset(); }
 
     void viewIdentifier()
     {
@@ -203,8 +204,8 @@ private slots:
         QVERIFY(action.isEnabled());
         QCOMPARE(triggered.size(), 1);
 
-        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("No such signal")));
-        QTest::ignoreMessage(QtCriticalMsg, QRegularExpression(QStringLiteral("cannot bind")));
+        expectMessage(QtWarningMsg, QRegularExpression(QStringLiteral("No such signal")));
+        expectMessage(QtCriticalMsg, QRegularExpression(QStringLiteral("cannot bind")));
         QVERIFY(!action.enabledBinding(&sender, SIGNAL(noSuchSignal(bool))));
     }
 

@@ -13,13 +13,14 @@
 using namespace HmiPhone;
 using Outputs = QStringList;
 
-class TestCallReactions : public QObject
+class TestCallReactions : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
+    void tearDown() override;
 private slots:
-    void init() { m_hmi = std::make_unique<GlobalHmi>(); }
-    void cleanup();
 
     void incomingCall_data();
     void incomingCall();
@@ -44,13 +45,11 @@ private:
     Mavrosk::PhoneSource *phone() const { return GlobalHmi::phone(); }
 
     std::unique_ptr<GlobalHmi> m_hmi;
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
-void TestCallReactions::cleanup()
+void TestCallReactions::tearDown()
 {
     m_hmi.reset();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
 }
 
 void TestCallReactions::incomingCall_data()

@@ -29,12 +29,12 @@ Mavrosk::PhoneSource *phone()
 }
 } // namespace
 
-class TestCallScreens : public QObject
+class TestCallScreens : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         Quorvel::HmiState *parent = buildRoot();
         auto *menu = new Quorvel::HmiViewState(Views::PhoneMenu,
@@ -49,11 +49,9 @@ private slots:
         start();
     }
 
-    void cleanup()
-    {
-        Quorvel::StateMachine::destroyInstance();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
+    void tearDown() override { Quorvel::StateMachine::destroyInstance(); }
+
+private slots:
 
     void keypadEditsNumber_data()
     {
@@ -216,7 +214,6 @@ private slots:
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 QTEST_GUILESS_MAIN(TestCallScreens)

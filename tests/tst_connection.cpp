@@ -51,6 +51,7 @@ extended, privacy        | $extended=5         | $mode(2); +4; HmiPhone_PrivacyR
 extended, cleared        | $extended=5         | $mode(2); +4; HmiPhone_ClearExtendedModeTimer; +15 | @4; $cleared
 extended, shortened      | $extended=10        | $mode(2); +5; phone.extendedModeTimerValue=4; +15 | @6; $private; $shutdown
 extended, none           | $extended=0         | $mode(2); +15 | @1; $private; $shutdown
+extended, popup covered   | $extended=5; phone.lowBatteryNotification=true; phone.deviceBatteryLevel=1 | $mode(2); +15 | @5; $private; $shutdown
 extended, not in stand-by | phone.extendedModeTimerValue=5 | $mode(2); +15 |
 
 Siri on                  |                     | phone.siriActive=true | transient $voiceMsg
@@ -92,12 +93,11 @@ const char *const names[][2] = {
         {"$pbInitiated", "PhonebookDownloadInitiated"},
 };
 
-class TestConnection : public QObject
+class TestConnection : public TestSupport::Suite
 {
     Q_OBJECT
 
 private slots:
-    void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
     void reactions_data();
     void reactions();
 
@@ -108,7 +108,6 @@ private:
     QStringList m_outputs;
     qint64 m_start = 0; // the virtual time the row's steps began
     qint64 m_minute = 0; // the last minute marked in the outputs
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 void TestConnection::reactions_data()

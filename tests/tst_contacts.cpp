@@ -52,16 +52,14 @@ const QString Waiting = QStringLiteral("-AutoDownload +WaitingForResponseFromPho
 
 } // namespace
 
-class TestContacts : public QObject
+class TestContacts : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void tearDown() override { Quorvel::StateMachine::destroyInstance(); }
+
 private slots:
-    void cleanup()
-    {
-        Quorvel::StateMachine::destroyInstance();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
 
     void entry_data()
     {
@@ -207,8 +205,6 @@ private:
         ScreenFixture::start();
         return mark();
     }
-
-    TestSupport::FrameworkWarningGuard m_warnings;
 };
 
 QTEST_GUILESS_MAIN(TestContacts)

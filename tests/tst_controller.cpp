@@ -69,26 +69,27 @@ void setRoaming(bool connected, bool roaming, bool warning)
 
 } // namespace
 
-class TestController : public QObject
+class TestController : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources())
             source->reset();
-        QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
+        expectMessage(QtCriticalMsg, InvalidIntegration);
         m_controller = std::make_unique<HmiPhoneController>(nullptr);
         m_since = Platform::Journal::instance()->lastSequence();
     }
 
-    void cleanup()
+    void tearDown() override
     {
         m_controller.reset();
         TestSupport::processUntilIdle();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
     }
+
+private slots:
 
     void eventRequests_data()
     {
@@ -313,8 +314,8 @@ private slots:
 
     void emptyToneIsRefused()
     {
-        QTest::ignoreMessage(QtCriticalMsg,
-                             "Hmi Phone Controller: tone string empty, cannot extract tone char");
+        expectMessage(QtCriticalMsg,
+                      "Hmi Phone Controller: tone string empty, cannot extract tone char");
         m_controller->dialPadTonePressed(QString(), QStringLiteral("1"));
         QVERIFY(trace(m_since).isEmpty());
     }
@@ -350,7 +351,7 @@ private slots:
         Mavrosk::PhoneSource *phone = Mavrosk::PhoneSource::instance();
         phone->setBridgeValue(QStringLiteral("callNumberEntered"), QStringLiteral("999"));
         m_controller.reset();
-        QTest::ignoreMessage(QtCriticalMsg, InvalidIntegration);
+        expectMessage(QtCriticalMsg, InvalidIntegration);
         m_controller = std::make_unique<HmiPhoneController>(nullptr);
         QCOMPARE(m_controller->property("isEmptyNumber").toBool(), true);
         phone->setBridgeValue(QStringLiteral("callNumberEntered"), QString());
@@ -526,7 +527,6 @@ private slots:
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
     std::unique_ptr<HmiPhoneController> m_controller;
     qint64 m_since = 0;
 };

@@ -23,16 +23,17 @@
 
 using namespace HmiPhone;
 
-class tst_Frame : public QObject
+class tst_Frame : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         Mavrosk::resetAll();
         m_mark = TestSupport::mark();
     }
+private slots:
 
     void pluginFileLoads()
     {

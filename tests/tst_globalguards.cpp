@@ -29,13 +29,14 @@ QStringList popupRequestsSince(qint64 since)
 
 } // namespace
 
-class TestGlobalGuards : public QObject
+class TestGlobalGuards : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
+    void tearDown() override;
 private slots:
-    void init() { m_hmi = std::make_unique<GlobalHmi>(); }
-    void cleanup();
 
     void incomingCall_data();
     void incomingCall();
@@ -46,13 +47,11 @@ private slots:
 
 private:
     std::unique_ptr<GlobalHmi> m_hmi;
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
-void TestGlobalGuards::cleanup()
+void TestGlobalGuards::tearDown()
 {
     m_hmi.reset();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
 }
 
 void TestGlobalGuards::incomingCall_data()

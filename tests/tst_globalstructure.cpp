@@ -218,13 +218,14 @@ QString describe(QAbstractTransition *transition)
 
 } // namespace
 
-class TestGlobalStructure : public QObject
+class TestGlobalStructure : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void setUp() override;
+    void tearDown() override;
 private slots:
-    void init();
-    void cleanup();
 
     void popupList();
     void transitionList();
@@ -232,19 +233,17 @@ private slots:
 
 private:
     std::unique_ptr<GlobalHmi> m_hmi;
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
-void TestGlobalStructure::init()
+void TestGlobalStructure::setUp()
 {
     m_hmi = std::make_unique<GlobalHmi>();
     QVERIFY(m_hmi->setUp());
 }
 
-void TestGlobalStructure::cleanup()
+void TestGlobalStructure::tearDown()
 {
     m_hmi.reset();
-    QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
 }
 
 void TestGlobalStructure::popupList()

@@ -12,12 +12,13 @@
 
 using namespace Mavrosk;
 
-class TestMavrosk : public QObject
+class TestMavrosk : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void setUp() override { resetAll(); }
 private slots:
-    void init() { resetAll(); }
 
     // Every value of every source, so that a property added later is held to the same contract.
     void propertyNotifiesOnChangeOnly_data()

@@ -14,6 +14,7 @@
 #include <taldris/hmiintentmanager.h>
 #include <taldris/hmisubmoduleprovider.h>
 
+#include <QLibraryInfo>
 #include <QQmlContext>
 #include <QQmlEngine>
 #include <QSignalSpy>
@@ -48,12 +49,12 @@ static QStringList tree(const QState *state, const QStringList &descend, const Q
     return names;
 }
 
-class TestPhonePlugin : public QObject
+class TestPhonePlugin : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         Mavrosk::resetAll();
         m_engine.reset(new QQmlEngine);
@@ -64,11 +65,38 @@ private slots:
         m_host->start();
     }
 
-    void cleanup()
+    void tearDown() override
     {
         m_host.reset();
         m_engine.reset();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
+    }
+
+private slots:
+    // A file that is not the phone plug-in is refused with an error that says why.
+    void loadErrors_data()
+    {
+        QTest::addColumn<QString>("file");
+        QTest::addColumn<QString>("error");
+        const QString plugins = QLibraryInfo::location(QLibraryInfo::PluginsPath);
+        QTest::addRow("missing file") << "no-such-plugin.so"
+                                      << "no such file";
+        QTest::addRow("not a plug-in") << HMIPHONE_PLUGIN_FILE ".txt"
+                                       << "not a Qt plug-in";
+        QTest::addRow("another interface")
+                << plugins + QStringLiteral("/platforms/libqminimal.so") << "not a module plug-in";
+    }
+    void loadErrors()
+    {
+        QFETCH(QString, file);
+        QFETCH(QString, error);
+        QFile text(QStringLiteral(HMIPHONE_PLUGIN_FILE ".txt"));
+        QVERIFY(text.open(QIODevice::WriteOnly) && text.write("not a library") > 0);
+        text.close();
+        Host::ModuleHost host;
+        QVERIFY(!host.load(file));
+        QVERIFY2(host.errorString().contains(error), qPrintable(host.errorString()));
+        QVERIFY(host.errorString().contains(file));
+        QVERIFY(!host.setUp(QStringLiteral("HmiPhone")));
     }
 
     void screenTree()
@@ -180,13 +208,12 @@ private slots:
         QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 
         if (!warning.isEmpty())
-            QTest::ignoreMessage(QtWarningMsg, qPrintable(warning));
+            expectMessage(QtWarningMsg, qPrintable(warning));
         request();
         TestSupport::processUntilIdle();
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
     QScopedPointer<QQmlEngine> m_engine;
     QScopedPointer<Host::ModuleHost> m_host;
 };

@@ -12,12 +12,11 @@ using namespace PhoneRootFixture;
 
 static const QString Connected = QStringLiteral("bluetooth.deviceConnected=true ");
 
-class TestPhoneRoot : public QObject
+class TestPhoneRoot : public TestSupport::Suite
 {
     Q_OBJECT
 
 private slots:
-    void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
     void firstScreen_data()
     {
         QTest::addColumn<QString>("data");
@@ -180,7 +179,6 @@ private slots:
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 QTEST_GUILESS_MAIN(TestPhoneRoot)

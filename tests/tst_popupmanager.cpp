@@ -104,21 +104,20 @@ QString phoneView(const char *view)
 
 } // namespace
 
-class TestPopupManager : public QObject
+class TestPopupManager : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         Quorvel::StateMachine::destroyInstance();
         Platform::Journal::instance()->clear();
     }
-    void cleanup()
-    {
-        Quorvel::StateMachine::destroyInstance();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
+
+    void tearDown() override { Quorvel::StateMachine::destroyInstance(); }
+
+private slots:
 
     void singleInstance()
     {
@@ -175,7 +174,6 @@ private slots:
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 QTEST_GUILESS_MAIN(TestPopupManager)

@@ -119,15 +119,16 @@ using Make = std::function<HmiAbstractTransition *(Source *, QState *)>;
 
 Q_DECLARE_METATYPE(Make)
 
-class TestQuorvel : public QObject
+class TestQuorvel : public TestSupport::Suite
 {
     Q_OBJECT
-private slots:
-    void cleanup()
+protected:
+    void tearDown() override
     {
         StateMachine::destroyInstance();
         Platform::Journal::instance()->clear();
     }
+private slots:
 
     void rootHierarchy()
     {

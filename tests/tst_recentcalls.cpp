@@ -30,16 +30,14 @@ QString screen(qint64 since)
 
 } // namespace
 
-class TestRecentCalls : public QObject
+class TestRecentCalls : public TestSupport::Suite
 {
     Q_OBJECT
 
+protected:
+    void tearDown() override { Quorvel::StateMachine::destroyInstance(); }
+
 private slots:
-    void cleanup()
-    {
-        Quorvel::StateMachine::destroyInstance();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
 
     void entry_data()
     {
@@ -184,7 +182,6 @@ private:
         ScreenFixture::start();
     }
 
-    TestSupport::FrameworkWarningGuard m_warnings;
     RecentCallsViewState *m_recentCalls = nullptr;
     PhoneMenuState *m_menu = nullptr;
 };

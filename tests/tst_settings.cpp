@@ -26,21 +26,19 @@ QString screen()
 
 } // namespace
 
-class TestSettings : public QObject
+class TestSettings : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void init()
+protected:
+    void setUp() override
     {
         m_hmi = std::make_unique<GlobalHmi>();
         Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceListCount"), 1);
     }
-    void cleanup()
-    {
-        m_hmi.reset();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
+    void tearDown() override { m_hmi.reset(); }
+
+private slots:
     void settings_data();
     void settings();
 
@@ -48,7 +46,6 @@ private:
     void play(const QString &step);
 
     std::unique_ptr<GlobalHmi> m_hmi;
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 // One step of a row: "x=v" (a Bluetooth value) before the start; "choose" (the settings menu's

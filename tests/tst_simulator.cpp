@@ -1,11 +1,13 @@
 // The simulator as a tester runs it: a scenario file in, the trace, the closing line and the exit
 // code out. A scenario is read and checked whole before anything runs.
 
+#include "testsupport.h"
+
 #include <QProcess>
 #include <QTemporaryDir>
 #include <QtTest>
 
-class SimulatorTest : public QObject
+class SimulatorTest : public TestSupport::Suite
 {
     Q_OBJECT
 private slots:

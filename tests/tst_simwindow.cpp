@@ -2,6 +2,8 @@
 // warnings, the incoming-call story shows its popup exactly while the trace says it is shown,
 // and a popup's button calls the controller slot it names.
 
+#include "testsupport.h"
+
 #include "headunitwindow.h"
 #include "outputwriter.h"
 #include "scenarioreader.h"
@@ -64,7 +66,7 @@ QStringList viewNames()
 
 } // namespace
 
-class TestSimWindow : public QObject
+class TestSimWindow : public TestSupport::Suite
 {
     Q_OBJECT
 

@@ -34,14 +34,12 @@ Mavrosk::PhoneSource *phone()
 }
 } // namespace
 
-class TestStatusAlerts : public QObject
+class TestStatusAlerts : public TestSupport::Suite
 {
     Q_OBJECT
 
-private slots:
-    void initTestCase() { m_integration = new HmiPhoneIntegration(this); }
-
-    void init()
+protected:
+    void setUp() override
     {
         Quorvel::HmiState *parent = buildRoot();
         auto *alerts = new PhoneStatusAlerts(m_integration, QStringLiteral("PhoneStatusAlertsCmp"),
@@ -55,11 +53,10 @@ private slots:
                  m_integration->createViewIdentifier(QStringLiteral("PhoneStatusAlerts")));
     }
 
-    void cleanup()
-    {
-        Quorvel::StateMachine::destroyInstance();
-        QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList());
-    }
+    void tearDown() override { Quorvel::StateMachine::destroyInstance(); }
+
+private slots:
+    void initTestCase() { m_integration = new HmiPhoneIntegration(this); }
 
     void requests_data()
     {
@@ -186,7 +183,6 @@ private slots:
     }
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
     HmiPhoneIntegration *m_integration = nullptr;
 };
 

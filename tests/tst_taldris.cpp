@@ -69,7 +69,7 @@ QStringList intents(qint64 since)
 
 } // namespace
 
-class TestTaldris : public QObject
+class TestTaldris : public TestSupport::Suite
 {
     Q_OBJECT
 private slots:
@@ -151,8 +151,7 @@ private slots:
 
         delete provider;
         since = TestSupport::mark();
-        QTest::ignoreMessage(QtWarningMsg,
-                             "IntentActionRequest: data provider of action 7 is gone");
+        expectMessage(QtWarningMsg, "IntentActionRequest: data provider of action 7 is gone");
         QVERIFY(!withProvider.run());
         QVERIFY(intents(since).isEmpty());
     }
@@ -188,7 +187,7 @@ private slots:
                 provider->requestSubmodule(id, host.get(), QStringLiteral("TEST"), 2);
             } else if (step == QLatin1String("drop-host")) {
                 host.reset();
-                QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("is gone")));
+                expectMessage(QtWarningMsg, QRegularExpression(QStringLiteral("is gone")));
             } else {
                 submodule.reset();
             }

@@ -19,7 +19,7 @@ static QString operator""_q(const char *text, size_t size)
     return QString::fromUtf8(text, int(size));
 }
 
-class TestTextMessageAlerts : public QObject
+class TestTextMessageAlerts : public TestSupport::Suite
 {
     Q_OBJECT
 
@@ -28,12 +28,10 @@ private slots:
     {
         QLoggingCategory::setFilterRules(QStringLiteral("orvane.hmiphone.debug=true"));
     }
-    void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
     void textMessages_data();
     void textMessages();
 
 private:
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 // Each row: bridge values before start, then steps: "@ms" lets time pass up to that moment,
@@ -177,7 +175,7 @@ void TestTextMessageAlerts::textMessages()
             });
 
     if (!debugLine.isEmpty())
-        QTest::ignoreMessage(QtDebugMsg, qPrintable(debugLine));
+        expectMessage(QtDebugMsg, qPrintable(debugLine));
     for (const QString &step : steps.split(QLatin1Char(' '), Qt::SkipEmptyParts)) {
         if (step.startsWith(QLatin1Char('@')))
             clock->advance(start + step.mid(1).toLongLong() - clock->now());

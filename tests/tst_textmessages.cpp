@@ -13,12 +13,11 @@
 using namespace HmiPhone;
 using namespace PhoneRootFixture;
 
-class TestTextMessages : public QObject
+class TestTextMessages : public TestSupport::Suite
 {
     Q_OBJECT
 
 private slots:
-    void cleanup() { QCOMPARE(TestSupport::FrameworkWarningGuard::take(), QStringList()); }
     // Selections in the list ("hear:<index>" or "options:<index>"), then the phone reports the
     // details: the last selection decides between reading aloud and opening the message.
     void openOrHear_data()
@@ -202,8 +201,6 @@ private:
         return phone;
     }
     static Mavrosk::PhoneSource *source() { return Mavrosk::PhoneSource::instance(); }
-
-    TestSupport::FrameworkWarningGuard m_guard;
 };
 
 QTEST_GUILESS_MAIN(TestTextMessages)

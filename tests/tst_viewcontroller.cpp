@@ -126,15 +126,16 @@ QStringList ids(const QStringList &names)
 
 } // namespace
 
-class TestViewController : public QObject
+class TestViewController : public TestSupport::Suite
 {
     Q_OBJECT
-private slots:
-    void cleanup()
+protected:
+    void tearDown() override
     {
         StateMachine::destroyInstance();
         Platform::Journal::instance()->clear();
     }
+private slots:
 
     // Operations: "+X" request, "-X" dismiss, "go:State" navigate.
     void popupStacking_data()

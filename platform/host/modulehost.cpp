@@ -11,14 +11,19 @@
 #include <taldris/hmisubmoduleprovider.h>
 #include <taldris/moduleinterface.h>
 
+#include <QAbstractEventDispatcher>
 #include <QCoreApplication>
+#include <QFileInfo>
 #include <QJsonObject>
+#include <QLoggingCategory>
 #include <QQmlContext>
 #include <QQmlEngine>
 
 namespace Host {
 
 namespace {
+
+Q_LOGGING_CATEGORY(hostLog, "orvane.host")
 
 const QString SettingsView = QStringLiteral("HOST.Settings");
 // The settings module as it names itself to the submodule provider, and the submodules it hosts.
@@ -27,14 +32,22 @@ const int PhoneSettingsSubmodule = 3;
 
 } // namespace
 
-void processUntilIdle()
+bool processUntilIdle(int maxRounds)
 {
-    // The machine's own queues are drained by the posted events that wake it: a few rounds let
-    // the events that transitions post in turn be handled too.
-    for (int round = 0; round < 20; ++round) {
+    // The machine's own queues are drained by the posted events that wake it; events that
+    // transitions post in turn wake it again. Idle is when nothing is pending any more.
+    QAbstractEventDispatcher *dispatcher = QAbstractEventDispatcher::instance();
+    for (int round = 0; round < maxRounds; ++round) {
         QCoreApplication::sendPostedEvents();
         QCoreApplication::processEvents(QEventLoop::AllEvents);
+        if (!dispatcher || !dispatcher->hasPendingEvents())
+            return true;
     }
+    qCCritical(hostLog,
+               "processUntilIdle: events still pending after %d rounds: something keeps "
+               "posting (a loop of transitions or popups?)",
+               maxRounds);
+    return false;
 }
 
 ModuleHost::ModuleHost(QObject *parent)
@@ -51,21 +64,30 @@ ModuleHost::~ModuleHost()
 
 bool ModuleHost::load(const QString &pluginFile)
 {
+    if (!QFileInfo(pluginFile).isFile()) {
+        m_error = QStringLiteral("cannot load %1: no such file").arg(pluginFile);
+        return false;
+    }
     m_loader.setFileName(pluginFile);
     const QString iid = m_loader.metaData().value(QLatin1String("IID")).toString();
+    if (iid.isEmpty()) {
+        m_error = QStringLiteral("cannot load %1: not a Qt plug-in (%2)")
+                          .arg(pluginFile, m_loader.errorString());
+        return false;
+    }
     if (iid != QLatin1String(Taldris_ModuleInterface_iid)) {
-        m_error = m_loader.errorString().isEmpty() || iid.isEmpty()
-                ? QStringLiteral("%1 is not a module plug-in (interface \"%2\")")
-                          .arg(pluginFile, iid)
-                : m_loader.errorString();
+        m_error = QStringLiteral("cannot load %1: a plug-in for \"%2\", not a module plug-in "
+                                 "(\"%3\")")
+                          .arg(pluginFile, iid, QLatin1String(Taldris_ModuleInterface_iid));
         return false;
     }
     QObject *instance = m_loader.instance();
     m_module = qobject_cast<Taldris::ModuleInterface *>(instance);
     if (!m_module) {
         m_error = instance
-                ? QStringLiteral("%1 does not implement the module interface").arg(pluginFile)
-                : m_loader.errorString();
+                ? QStringLiteral("cannot load %1: it does not implement the module interface")
+                          .arg(pluginFile)
+                : QStringLiteral("cannot load %1: %2").arg(pluginFile, m_loader.errorString());
         return false;
     }
     return true;

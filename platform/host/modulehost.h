@@ -25,9 +25,10 @@ class ModuleInterface;
 
 namespace Host {
 
-// Runs the event loop until the machine has handled what was posted (start and posted events are
-// asynchronous).
-void processUntilIdle();
+// Runs the event loop until nothing is pending any more (start and posted events are
+// asynchronous, and transitions post in turn). Returns false, with a critical message, when
+// events are still pending after `maxRounds` rounds.
+bool processUntilIdle(int maxRounds = 1000);
 
 // A small HMI host for one module. The host's screens in the state machine's screens region:
 //   "HOST.Home"      the home screen, a view state and the initial screen;
