@@ -76,6 +76,11 @@ PopupSlot::PopupSlot(PopupState *popup, PopupRegion *region)
     popup->setParent(this);
 }
 
+PopupState *PopupSlot::popup() const
+{
+    return m_popup;
+}
+
 PopupRegion *StateMachinePrivate::createPopupRegion(const QString &name, QState *parent)
 {
     auto *region = new PopupRegion(name, parent);
@@ -206,7 +211,7 @@ void StateMachinePrivate::syncRegion(PopupRegion *region, QEvent *event)
     Q_ASSERT(armedSlots.isEmpty());
     for (QObject *child : region->children()) {
         auto *slot = dynamic_cast<PopupSlot *>(child);
-        if (!slot)
+        if (!slot || !slot->popup())
             continue;
         const bool open = region->stack.contains(slot->popup());
         if (open != isActive(slot->popup())) {

@@ -107,13 +107,13 @@ class PopupSlot : public QState
 {
 public:
     PopupSlot(PopupState *popup, PopupRegion *region);
-    PopupState *popup() const { return m_popup; }
+    PopupState *popup() const; // null once the popup is deleted
     PopupRegion *region() const { return static_cast<PopupRegion *>(parentState()); }
     QState *closedState() const { return m_closed; }
     ArmedTransition *mover() const { return m_mover; }
 
 private:
-    PopupState *m_popup;
+    QPointer<PopupState> m_popup;
     QState *m_closed;
     ArmedTransition *m_mover;
 };
