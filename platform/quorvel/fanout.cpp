@@ -204,6 +204,9 @@ void StateMachinePrivate::beginSelect(QEvent *event)
     const QEvent::Type type = event->type();
     if (type == QEvent::None)
         return;
+    // Whatever was armed or moved for the previous event was taken by its step and put back.
+    Q_ASSERT(!router->isArmed());
+    Q_ASSERT(armedSlots.isEmpty());
 
     if (type == FireEvent::eventType()) {
         auto *fire = static_cast<FireEvent *>(event);

@@ -7,7 +7,6 @@ namespace Quorvel {
 
 HmiAbstractTransition::HmiAbstractTransition(QState *source)
     : QAbstractTransition(source)
-    , m_sequence(StateMachinePrivate::get()->nextSequence())
 { }
 
 HmiAbstractTransition::~HmiAbstractTransition()

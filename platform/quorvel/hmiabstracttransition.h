@@ -79,7 +79,6 @@ private:
     // Asks the connected guard slots; true when there is none.
     bool runGuard(QEvent *event);
 
-    quint64 m_sequence = 0;
     bool m_allow = false;
     bool m_allowDefault = false;
     QVariant m_data;

@@ -27,6 +27,16 @@ int insertionIndex(const QList<QPointer<PopupState>> &stack, const PopupState *p
     return index;
 }
 
+// The stack is ordered by priority, bottom first.
+bool ordered(const QList<QPointer<PopupState>> &stack)
+{
+    for (int i = 1; i < stack.size(); ++i) {
+        if (stack.at(i - 1) && stack.at(i) && stack.at(i - 1)->priority() > stack.at(i)->priority())
+            return false;
+    }
+    return true;
+}
+
 void record(const QString &kind, const PopupState *popup)
 {
     Platform::Journal::instance()->append(kind, {{QStringLiteral("id"), popup->viewId()}});
@@ -165,6 +175,7 @@ void StateMachinePrivate::perform(const PopupOp &op)
     region->stack.removeAll(nullptr);
     region->stack.removeAll(popup);
     region->stack.insert(insertionIndex(region->stack, popup), popup);
+    Q_ASSERT(ordered(region->stack));
     scheduleSync(region);
 }
 
@@ -208,6 +219,8 @@ void StateMachinePrivate::syncRegion(PopupRegion *region, QEvent *event)
     markTopToReport(region);
     if (armedSlots.isEmpty())
         reportTops();
+    else
+        Q_ASSERT(!router->isArmed()); // one step opens and closes the slots, nothing else
 }
 
 void StateMachinePrivate::popupEntered(PopupState *popup)
@@ -218,15 +231,9 @@ void StateMachinePrivate::popupEntered(PopupState *popup)
         // Entered by a module transition rather than by a request: open now.
         if (!stack.contains(popup))
             stack.insert(insertionIndex(stack, popup), popup);
-        if (stack.last() == popup && region->shown != popup) {
-            if (region->shown) {
-                record(QStringLiteral("popup-hidden"), region->shown);
-                emit q->popupHidden(region->shown);
-            }
-            region->shown = popup;
-            record(QStringLiteral("popup-shown"), popup);
-            emit q->popupShown(popup);
-        }
+        Q_ASSERT(ordered(stack));
+        if (stack.last() == popup && region->shown != popup)
+            putOnTop(region, popup);
     }
     for (const QPointer<PopupState> &dismissed : qAsConst(popup->m_dismissesWhenShown)) {
         if (dismissed)
@@ -276,8 +283,16 @@ void StateMachinePrivate::reportTop(PopupRegion *region)
                 top = region->stack.at(i);
         }
     }
-    if (top == region->shown)
-        return;
+    // A popup reported on top is open, or was reported hidden when it closed.
+    Q_ASSERT(!region->shown || isActive(region->shown));
+    if (top != region->shown)
+        putOnTop(region, top);
+}
+
+// The popup shown on top of the region changes: the one there is hidden (it stays open,
+// covered), `top` (if any) is shown.
+void StateMachinePrivate::putOnTop(PopupRegion *region, PopupState *top)
+{
     if (region->shown) {
         record(QStringLiteral("popup-hidden"), region->shown);
         emit q->popupHidden(region->shown);

@@ -154,7 +154,6 @@ public:
     void postHeld();
 
     // Notifications and their fan-out (fanout.cpp).
-    quint64 nextSequence() { return ++m_sequence; }
     void listenToEvent(HmiAbstractTransition *transition, const QString &eventName);
     bool listenToSignal(HmiAbstractTransition *transition, const QObject *sender, int signalIndex);
     void forget(HmiAbstractTransition *transition);
@@ -199,6 +198,7 @@ public:
     void syncRegion(PopupRegion *region, QEvent *event);
     void markTopToReport(PopupRegion *region);
     void reportTop(PopupRegion *region);
+    void putOnTop(PopupRegion *region, PopupState *top);
     void reportTops();
     QStringList openPopups() const;
 
@@ -217,7 +217,6 @@ public:
     PopupRegion *popups = nullptr;
     QList<QEvent *> held; // posted before the machine ran, in posting order
 
-    quint64 m_sequence = 0;
     QHash<QString, QVector<HmiAbstractTransition *>> eventListeners;
     QHash<QPair<const QObject *, int>, SignalRelay *> relays;
     QHash<QString, QVector<NamedState *>> names;
