@@ -51,6 +51,7 @@ extended, privacy        | $extended=5         | $mode(2); +4; HmiPhone_PrivacyR
 extended, cleared        | $extended=5         | $mode(2); +4; HmiPhone_ClearExtendedModeTimer; +15 | @4; $cleared
 extended, shortened      | $extended=10        | $mode(2); +5; phone.extendedModeTimerValue=4; +15 | @6; $private; $shutdown
 extended, none           | $extended=0         | $mode(2); +15 | @1; $private; $shutdown
+extended, smallest int   | $extended=-2147483648 | $mode(2); +15 | @1; $private; $shutdown
 extended, popup covered   | $extended=5; phone.lowBatteryNotification=true; phone.deviceBatteryLevel=1 | $mode(2); +15 | @5; $private; $shutdown
 extended, not in stand-by | phone.extendedModeTimerValue=5 | $mode(2); +15 |
 

@@ -97,7 +97,8 @@ void TestSettings::settings_data()
 {
     QTest::addColumn<QString>("steps");
     QTest::addColumn<QString>("screen");
-    // Intents requested, ringtone previews stopped ("stop") and settings-menu entry changes.
+    // Intents requested, ringtone previews stopped ("stop"), the phonebook check event posted
+    // ("check") and settings-menu entry changes.
     QTest::addColumn<QString>("outputs");
     auto row = [](const char *tag, const char *steps, const char *screen, const char *outputs) {
         QTest::addRow("%s", tag) << QString::fromLatin1(steps) << QString::fromLatin1(screen)
@@ -138,9 +139,9 @@ void TestSettings::settings_data()
     row("disconnected on manage contacts, back", "choose contacts disconnect back", "HOST.Settings", "intent 7()");
     // Every change of the phonebook status while the settings are active has the phone check it
     // (with no contacts yet and automatic download off, the check asks the driver to download).
-    row("phonebook status on the settings page", "choose status:4 status:3 status:3 status:5", "PhoneSettings PhoneBookAutoDownload", "intent 7() intent 67() intent 67() intent 67()");
-    row("phonebook status on manage contacts", "choose contacts status:3", "PhoneManageContactsSettings", "intent 7() intent 67()");
-    row("phonebook status in the limbo", "deviceConnected=false choose status:3", "limbo", "intent 7() intent 15() intent 67()");
+    row("phonebook status on the settings page", "choose status:4 status:3 status:3 status:5", "PhoneSettings PhoneBookAutoDownload", "intent 7() intent 67() check intent 67() check intent 67() check");
+    row("phonebook status on manage contacts", "choose contacts status:3", "PhoneManageContactsSettings", "intent 7() intent 67() check");
+    row("phonebook status in the limbo", "deviceConnected=false choose status:3", "limbo", "intent 7() intent 15() intent 67() check");
     row("phonebook status outside", "status:1 status:3", "HOST.Home", "");
     // clang-format on
 }
@@ -173,6 +174,9 @@ void TestSettings::settings()
                             + entry.fields.value(QStringLiteral("enabled")).toString();
         else if (call == QLatin1String("phone.stopPlayRingtone"))
             lines << QStringLiteral("stop");
+        else if (entry.fields.value(QStringLiteral("name"))
+                 == QLatin1String("HmiPhone_PhoneBookStatusCheck"))
+            lines << QStringLiteral("check");
     }
     QCOMPARE(lines.join(QLatin1Char(' ')), outputs);
 }

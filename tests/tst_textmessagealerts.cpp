@@ -59,6 +59,7 @@ void TestTextMessageAlerts::textMessages_data()
     QTest::addRow("alert: view") << ""_q << "phone.newTextMessageAlert HmiPhone_ViewNewTextMessage @30000"_q << "count=1 +NewTextMessageAlert2 -NewTextMessageAlert2 requestNewTextMessageDetails() checkPhoneStatus() [PhoneSmsView]"_q << ""_q;
     QTest::addRow("alert: reply") << ""_q << "phone.newTextMessageAlert HmiPhone_ReplyNewTextMessage @30000"_q << "count=1 +NewTextMessageAlert2 -NewTextMessageAlert2 checkPhoneStatus() [PhoneSmsReplyView]"_q << ""_q;
     QTest::addRow("listen from the list") << "phone.listenMessageLineNo=3"_q << "phone.textMessageDetailsReady phone.listenToMessageRequested phone.textMessageDetailsReady phone.textMessageDetailsReady"_q << "requestSelectedTextMessageDetails(2) textMessagePlayback(Late)"_q << ""_q;
+    QTest::addRow("listen: the smallest line number") << "phone.listenMessageLineNo=-2147483648"_q << "phone.listenToMessageRequested phone.textMessageDetailsReady"_q << ""_q << "Listen Message Line No Index Out of Range "_q;
 
     QTest::addRow("send: status 2, then the messages") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone.sendMessageStatusChanged:2 @5000"_q << "send noResponse(false) +Progress -Progress +Success @5000 -Success !HmiPhone_ShowSmsRequest +TextMessagingOff"_q << ""_q;
     QTest::addRow("send: status 0") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone.sendMessageStatusChanged:0"_q << "send noResponse(false) +Progress -Progress +Failure"_q << ""_q;

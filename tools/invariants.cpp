@@ -1,5 +1,7 @@
 #include "invariants.h"
 
+#include "virtualeventdispatcher.h"
+
 #include <brisken/viewcontroller.h>
 #include <host/modulehost.h>
 #include <journal/journal.h>
@@ -97,6 +99,11 @@ Invariants::Invariants(Host::ModuleHost *host, QObject *parent)
 {
     connect(Platform::Journal::instance(), &Platform::Journal::appended, this,
             &Invariants::onJournalEntry);
+    connect(Mavrosk::PhoneSource::instance(), &Mavrosk::PhoneSource::extendedModeTimerValueChanged,
+            this, [this] {
+                if (auto *clock = VirtualEventDispatcher::instance())
+                    m_countdownChanged = clock->now();
+            });
 }
 
 Invariants::~Invariants() = default;
@@ -149,12 +156,19 @@ QString Invariants::check(QObject *controller)
                 .arg(views.join(QStringLiteral(", ")),
                      active ? active->objectName() : QStringLiteral("none"), activeLeaves());
 
-    const QStringList open = Brisken::ViewController::instance()->shownPopups();
+    // The journal's popup-shown and popup-hidden say what is on top; covered popups stay open.
+    Brisken::ViewController *viewController = Brisken::ViewController::instance();
+    const QStringList onTop = viewController->shownPopups();
+    const QStringList open = viewController->openPopups();
+    const QSet<QString> onTopSet(onTop.begin(), onTop.end());
     const QSet<QString> openSet(open.begin(), open.end());
-    if (openSet != m_shownPopups || openSet.size() != open.size())
-        return QStringLiteral("open popups %1, the journal shows %2")
-                .arg(open.isEmpty() ? QStringLiteral("none") : open.join(QStringLiteral(", ")),
+    if (onTopSet != m_shownPopups || onTopSet.size() != onTop.size())
+        return QStringLiteral("popups on top %1, the journal shows %2")
+                .arg(onTop.isEmpty() ? QStringLiteral("none") : onTop.join(QStringLiteral(", ")),
                      sorted(m_shownPopups));
+    if (!openSet.contains(onTopSet) || openSet.size() != open.size())
+        return QStringLiteral("popups on top %1, open %2")
+                .arg(onTop.join(QStringLiteral(", ")), open.join(QStringLiteral(", ")));
 
     auto *phone = Mavrosk::PhoneSource::instance();
     if (!phone->incomingCall()) {
@@ -165,14 +179,23 @@ QString Invariants::check(QObject *controller)
         }
     }
 
-    if (m_host->integration()) {
+    // The module's one timer counts the extended mode down a minute a tick: it stops by the end
+    // of the countdown the phone gives, whatever the phone said in between.
+    auto *clock = VirtualEventDispatcher::instance();
+    if (m_host->integration() && clock) {
         for (QTimer *timer : m_host->integration()->findChildren<QTimer *>()) {
-            if (timer->isActive() && open.isEmpty() && phone->currentExtendedMode() == 0)
-                return QStringLiteral("module timer %1 (%2 ms) runs with no popup open and no "
-                                      "extended mode")
-                        .arg(timer->objectName().isEmpty() ? QStringLiteral("(unnamed)")
-                                                           : timer->objectName())
-                        .arg(timer->interval());
+            const qint64 since = timer->isActive() ? clock->startedAt(timer->timerId()) : -1;
+            if (since < 0 || timer->interval() <= 0)
+                continue;
+            // A countdown the phone shortened ends at the next tick.
+            const qint64 ticks = (clock->now() - since) / timer->interval();
+            const qint64 countdown = qMax(0, phone->extendedModeTimerValue());
+            if (ticks > countdown + 1 && clock->now() - m_countdownChanged > timer->interval())
+                return QStringLiteral("a module timer of %1 ms has ticked %2 times and runs on; "
+                                      "the extended mode lasts %3 minutes")
+                        .arg(timer->interval())
+                        .arg(ticks)
+                        .arg(phone->extendedModeTimerValue());
         }
     }
 

@@ -20,10 +20,12 @@ namespace Simulator {
 //   - the machine runs;
 //   - exactly one view state is on screen (the innermost active view state is the framework's
 //     active view);
-//   - the framework's open popups are those that the journal reported shown and not hidden since;
-//   - no "IncomingCall" or "WaitingCall" is open while the phone reports no incoming call;
-//   - no timer of the module runs without a popup open or the extended-mode countdown running
-//     (the phone in extended mode);
+//   - the popups on top are those that the journal reported shown and not hidden since, and each
+//     is open (covered popups stay open);
+//   - no "IncomingCall" or "WaitingCall" is open, on top or covered, while the phone reports no
+//     incoming call;
+//   - no timer of the module runs on past its countdown (the extended mode's minutes as the phone
+//     gives them now);
 //   - every driver-restricted window the module sets lies inside the contact list;
 //   - the controller's isEmptyNumber agrees with the phone's entered number.
 class Invariants : public QObject
@@ -45,6 +47,7 @@ private:
     int m_pendingMinRow = 0;
     bool m_minRowSet = false;
     QStringList m_windowErrors;
+    qint64 m_countdownChanged = 0; // when the phone last changed the extended mode's length
 };
 
 } // namespace Simulator

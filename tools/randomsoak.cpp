@@ -294,8 +294,9 @@ QString RandomSoak::nextStep()
         return line(step);
     }
     if (roll < 87) {
-        static const char *const places[] = {"phone", "phone", "home", "home", "settings"};
-        return line({{QStringLiteral("open"), QString::fromLatin1(places[pick(5)])}});
+        static const char *const places[]
+                = {"phone", "phone", "home", "home", "settings", "settings/Phone"};
+        return line({{QStringLiteral("open"), QString::fromLatin1(places[pick(6)])}});
     }
     if (roll < 91)
         return line({{QStringLiteral("back"), chance(90) ? 1 : 2 + pick(2)}});

@@ -68,6 +68,12 @@ qint64 VirtualEventDispatcher::nextDueTime() const
     return due;
 }
 
+qint64 VirtualEventDispatcher::startedAt(int timerId) const
+{
+    const int index = indexOf(timerId);
+    return index < 0 ? -1 : m_timers.at(index).since;
+}
+
 bool VirtualEventDispatcher::fireNextTimer(qint64 until)
 {
     int next = -1;
@@ -151,7 +157,7 @@ void VirtualEventDispatcher::registerTimer(int timerId, int interval, Qt::TimerT
     if (existing >= 0)
         m_timers.removeAt(existing);
     m_timers.append(Timer{timerId, qMax(0, interval), timerType, object,
-                          later(m_now, qMax(0, interval)), ++m_order});
+                          later(m_now, qMax(0, interval)), ++m_order, m_now});
 }
 
 bool VirtualEventDispatcher::unregisterTimer(int timerId)

@@ -40,6 +40,8 @@ public:
     void advance(qint64 milliseconds);
     // The due time of the earliest armed timer, or -1 when none is armed.
     qint64 nextDueTime() const;
+    // When the timer was started (a repeating timer runs on from then), or -1 when it is not.
+    qint64 startedAt(int timerId) const;
 
     bool processEvents(QEventLoop::ProcessEventsFlags flags) override;
     bool hasPendingEvents() override;
@@ -64,6 +66,7 @@ private:
         QObject *object;
         qint64 due;
         quint64 order; // arming order among timers of the same due time
+        qint64 since; // when it was started
     };
 
     bool deliverPostedEvents();

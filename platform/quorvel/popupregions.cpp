@@ -76,6 +76,11 @@ PopupSlot::PopupSlot(PopupState *popup, PopupRegion *region)
     popup->setParent(this);
 }
 
+PopupState *PopupSlot::popup() const
+{
+    return m_popup;
+}
+
 PopupRegion *StateMachinePrivate::createPopupRegion(const QString &name, QState *parent)
 {
     auto *region = new PopupRegion(name, parent);
@@ -206,7 +211,7 @@ void StateMachinePrivate::syncRegion(PopupRegion *region, QEvent *event)
     Q_ASSERT(armedSlots.isEmpty());
     for (QObject *child : region->children()) {
         auto *slot = dynamic_cast<PopupSlot *>(child);
-        if (!slot)
+        if (!slot || !slot->popup())
             continue;
         const bool open = region->stack.contains(slot->popup());
         if (open != isActive(slot->popup())) {
@@ -232,15 +237,8 @@ void StateMachinePrivate::popupEntered(PopupState *popup)
         if (!stack.contains(popup))
             stack.insert(insertionIndex(stack, popup), popup);
         Q_ASSERT(ordered(stack));
-        if (stack.last() == popup && region->shown != popup) {
-            if (region->shown) {
-                record(QStringLiteral("popup-hidden"), region->shown);
-                emit q->popupHidden(region->shown);
-            }
-            region->shown = popup;
-            record(QStringLiteral("popup-shown"), popup);
-            emit q->popupShown(popup);
-        }
+        if (stack.last() == popup && region->shown != popup)
+            putOnTop(region, popup);
     }
     for (const QPointer<PopupState> &dismissed : qAsConst(popup->m_dismissesWhenShown)) {
         if (dismissed)
@@ -292,8 +290,14 @@ void StateMachinePrivate::reportTop(PopupRegion *region)
     }
     // A popup reported on top is open, or was reported hidden when it closed.
     Q_ASSERT(!region->shown || isActive(region->shown));
-    if (top == region->shown)
-        return;
+    if (top != region->shown)
+        putOnTop(region, top);
+}
+
+// The popup shown on top of the region changes: the one there is hidden (it stays open,
+// covered), `top` (if any) is shown.
+void StateMachinePrivate::putOnTop(PopupRegion *region, PopupState *top)
+{
     if (region->shown) {
         record(QStringLiteral("popup-hidden"), region->shown);
         emit q->popupHidden(region->shown);

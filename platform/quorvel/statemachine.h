@@ -64,7 +64,7 @@ public:
     HmiState *levelState(StateLevel level) const;
     // The screens region: the host's screens and the parent states of the modules go here.
     HmiState *screensState() const;
-    // The global popup region (a plain compound state; its popups are managed by the framework).
+    // The global popup region (a parallel state of popup slots, managed by the framework).
     QState *popupRegion() const;
 
     // Installs a module's root-hierarchy lists. Each popup joins the global popup region. Each

@@ -134,13 +134,13 @@ class PopupSlot : public QState
 {
 public:
     PopupSlot(PopupState *popup, PopupRegion *region);
-    PopupState *popup() const { return m_popup; }
+    PopupState *popup() const; // null once the popup is deleted
     PopupRegion *region() const { return static_cast<PopupRegion *>(parentState()); }
     QState *closedState() const { return m_closed; }
     ArmedTransition *mover() const { return m_mover; }
 
 private:
-    PopupState *m_popup;
+    QPointer<PopupState> m_popup;
     QState *m_closed;
     ArmedTransition *m_mover;
 };
@@ -229,6 +229,7 @@ public:
     void syncRegion(PopupRegion *region, QEvent *event);
     void markTopToReport(PopupRegion *region);
     void reportTop(PopupRegion *region);
+    void putOnTop(PopupRegion *region, PopupState *top);
     void reportTops();
     QStringList openPopups() const;
 

@@ -115,7 +115,8 @@ void HmiPhoneGlobalStateHandler::clearExtendedModeTimer()
 void HmiPhoneGlobalStateHandler::extendedModeTimerMinuteElapsed()
 {
     ++m_extendedModeMinutesElapsed;
-    const int extendedMinutes = m_phoneSource->extendedModeTimerValue();
+    // The length comes from the phone: any int, so the difference is taken in 64 bits.
+    const qint64 extendedMinutes = m_phoneSource->extendedModeTimerValue();
     if (extendedMinutes - m_extendedModeMinutesElapsed == extendedModeWarningMinutes
         && m_phoneSource->callConnected()) {
         m_popupManager->showPhoneCallStandByModePopup();

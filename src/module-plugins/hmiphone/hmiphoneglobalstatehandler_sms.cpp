@@ -135,8 +135,14 @@ void HmiPhoneGlobalStateHandler::viewNewTextMessageAlert()
 
 void HmiPhoneGlobalStateHandler::handleListenMessageRequest()
 {
-    // The voice system counts lines from 1, the phone's messages from 0.
-    m_phoneSource->requestSelectedTextMessageDetails(m_phoneSource->listenMessageLineNo() - 1);
+    // The voice system counts lines from 1, the phone's messages from 0: a line before the first
+    // names no message. Widened before subtracting: the smallest int has no index before it.
+    const qint64 index = qint64(m_phoneSource->listenMessageLineNo()) - 1;
+    if (index < 0) {
+        qCDebug(hmiphone()) << "Listen Message Line No Index Out of Range ";
+        return;
+    }
+    m_phoneSource->requestSelectedTextMessageDetails(int(index));
     m_listenMessageRequested = true;
 }
 
