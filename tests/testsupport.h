@@ -90,6 +90,17 @@ inline QStringList journalLines(qint64 since, const QStringList &kinds = {})
     return lines;
 }
 
+// The same lines in brief: views and popups by view name ("popup-request IncomingCall") and
+// bridge commands as "bridge phone.endCall", without their arguments.
+inline QStringList briefJournalLines(qint64 since, const QStringList &kinds)
+{
+    static const QRegularExpression module(QStringLiteral("^(view\\S*|popup-\\w+) \\w+\\."));
+    static const QRegularExpression command(QStringLiteral("^(\\w+\\.\\w+)\\(.*\\)$"));
+    return journalLines(since, kinds)
+            .replaceInStrings(module, QStringLiteral("\\1 "))
+            .replaceInStrings(command, QStringLiteral("bridge \\1"));
+}
+
 inline QStringList bridgeCommandsSince(qint64 since)
 {
     return journalLines(since, {QStringLiteral("bridge")});
