@@ -13,12 +13,9 @@
 #include <host/modulehost.h>
 #include <mavrosk/bluetoothsource.h>
 #include <mavrosk/bridge.h>
-#include <mavrosk/datasource.h>
 #include <mavrosk/phonesource.h>
 #include <quorvel/hmievent.h>
 #include <quorvel/statemachine.h>
-
-#include <QJsonDocument>
 
 #include <memory>
 
@@ -87,7 +84,6 @@ public:
                 : nullptr;
         for (Mavrosk::DataSource *candidate : Mavrosk::DataSource::sources())
             object = candidate->shortName() == source ? candidate : object;
-        const QString value = step.section(QLatin1Char('='), 1);
         QString error;
         if (step.contains(QLatin1Char('!'))) {
             const QString argument = step.section(QRegularExpression(QStringLiteral("[()]")), 1, 1);
@@ -96,13 +92,8 @@ public:
                                                                 : QVariantList{argument},
                                              QMetaMethod::Signal, &error),
                      qPrintable(step + QLatin1Char(' ') + error));
-        } else if (object) {
-            QVERIFY2(qobject_cast<Mavrosk::DataSource *>(object)->setBridgeValue(
-                             member,
-                             value.startsWith(QLatin1Char('['))
-                                     ? QJsonDocument::fromJson(value.toUtf8()).toVariant()
-                                     : QVariant(value)),
-                     qPrintable(step));
+        } else if (step.contains(QLatin1Char('='))) {
+            QVERIFY2(TestSupport::setBridgeValue(step), qPrintable(step));
         } else {
             Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(step));
         }

@@ -13,11 +13,6 @@
 
 using Simulator::VirtualEventDispatcher;
 
-static QString operator""_q(const char *text, size_t size)
-{
-    return QString::fromUtf8(text, int(size));
-}
-
 class TestTextMessageAlerts : public TestSupport::Suite
 {
     Q_OBJECT
