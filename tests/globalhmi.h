@@ -3,7 +3,9 @@
 // The phone module brought up by the host library as a head unit's host does, for the tests of
 // the phone's global popups and reactions, and what the HMI shows as the tests read it.
 
+#include "hmiphonecontroller.h"
 #include "hmiphoneintegration.h"
+#include "metainvoke.h"
 #include "testsupport.h"
 
 #include <brisken/datastore.h>
@@ -57,31 +59,45 @@ public:
 
     // What a driver or the phone noticed since `since`, in order, as "kind name": popups asked
     // for and dismissed, views asked for and shown (by view name), transients, events posted,
-    // commands to the phone and keys handed back to the platform's seek function.
+    // commands to the phone (without arguments) and keys handed back to the platform's seek
+    // function.
     static QStringList outputsSince(qint64 since)
     {
-        QStringList outputs;
-        for (const auto &entry : Platform::Journal::instance()->entriesSince(since)) {
-            QString what;
-            if (entry.kind == QLatin1String("popup-request")
-                || entry.kind == QLatin1String("popup-dismiss")
-                || entry.kind == QLatin1String("view-request")
-                || entry.kind == QLatin1String("view"))
-                what = entry.fields.value(QStringLiteral("id"))
-                               .toString()
-                               .section(QLatin1Char('.'), 1);
-            else if (entry.kind.startsWith(QLatin1String("transient")))
-                what = entry.fields.value(QStringLiteral("name")).toString();
-            else if (entry.kind == QLatin1String("event"))
-                what = entry.fields.value(QStringLiteral("name")).toString();
-            else if (entry.kind == QLatin1String("bridge")
-                     || entry.kind == QLatin1String("hardkey"))
-                what = entry.fields.value(QStringLiteral("call")).toString();
-            else
-                continue;
-            outputs.append(entry.kind + QLatin1Char(' ') + what);
+        return TestSupport::briefJournalLines(
+                since,
+                {QStringLiteral("popup-request"), QStringLiteral("popup-dismiss"),
+                 QStringLiteral("view-request"), QStringLiteral("view"),
+                 QStringLiteral("transient"), QStringLiteral("transient-hide"),
+                 QStringLiteral("event"), QStringLiteral("bridge"), QStringLiteral("hardkey")});
+    }
+
+    // One step of the phone's side or the driver: "source.property=value" a bridge value (a JSON
+    // list when it starts with '['), "source!signal" or "source!signal(argument)" a signal of a
+    // data source or of the controller ("controller!..."), anything else an event posted. The
+    // machine settles after it.
+    void apply(const QString &step)
+    {
+        const QString source = step.section(QRegularExpression(QStringLiteral("[.!]")), 0, 0);
+        const QString member = step.section(QRegularExpression(QStringLiteral("[.!=(]")), 1, 1);
+        QObject *object = source == QLatin1String("controller")
+                ? m_host.integration()->findChild<HmiPhone::HmiPhoneController *>()
+                : nullptr;
+        for (Mavrosk::DataSource *candidate : Mavrosk::DataSource::sources())
+            object = candidate->shortName() == source ? candidate : object;
+        QString error;
+        if (step.contains(QLatin1Char('!'))) {
+            const QString argument = step.section(QRegularExpression(QStringLiteral("[()]")), 1, 1);
+            QVERIFY2(Simulator::invokeByName(object, member,
+                                             argument.isEmpty() ? QVariantList()
+                                                                : QVariantList{argument},
+                                             QMetaMethod::Signal, &error),
+                     qPrintable(step + QLatin1Char(' ') + error));
+        } else if (step.contains(QLatin1Char('='))) {
+            QVERIFY2(TestSupport::setBridgeValue(step), qPrintable(step));
+        } else {
+            Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(step));
         }
-        return outputs;
+        TestSupport::processUntilIdle();
     }
 
     static bool shown(const QString &view)

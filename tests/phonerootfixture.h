@@ -11,24 +11,11 @@
 
 namespace PhoneRootFixture {
 
-// Test data written as plain literals.
-inline QString operator""_q(const char *text, size_t size)
-{
-    return QString::fromUtf8(text, int(size));
-}
-
 // Writes bridge values as the phone's side would, given as "source.property=value ...".
 inline void setValues(const QString &values)
 {
-    for (const QString &value : values.split(QLatin1Char(' '), Qt::SkipEmptyParts)) {
-        const QString key = value.section(QLatin1Char('='), 0, 0);
-        for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources()) {
-            if (source->shortName() == key.section(QLatin1Char('.'), 0, 0))
-                QVERIFY2(source->setBridgeValue(key.section(QLatin1Char('.'), 1),
-                                                value.section(QLatin1Char('='), 1)),
-                         qPrintable(value));
-        }
-    }
+    for (const QString &value : values.split(QLatin1Char(' '), Qt::SkipEmptyParts))
+        QVERIFY2(TestSupport::setBridgeValue(value), qPrintable(value));
 }
 
 // A fresh host with the data `values`, the phone built under it and the machine started.

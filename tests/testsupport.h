@@ -5,13 +5,21 @@
 
 #include <host/modulehost.h>
 #include <journal/journal.h>
+#include <mavrosk/datasource.h>
 #include <quorvel/hmievent.h>
 #include <quorvel/statemachine.h>
 
 #include <QCoreApplication>
+#include <QJsonDocument>
 #include <QRegularExpression>
 #include <QStringList>
 #include <QTest>
+
+// Test data written as plain literals.
+inline QString operator""_q(const char *text, size_t size)
+{
+    return QString::fromUtf8(text, int(size));
+}
 
 namespace TestSupport {
 
@@ -36,6 +44,23 @@ inline qint64 post(const QString &name, const QVariant &value = QVariant())
     const qint64 posted = mark();
     processUntilIdle();
     return posted;
+}
+
+// Writes a bridge value as the phone's side would, given as "source.property=value" (a JSON list
+// when the value starts with '['). False when no source has that short name or the property.
+inline bool setBridgeValue(const QString &assignment)
+{
+    const QString key = assignment.section(QLatin1Char('='), 0, 0);
+    const QString value = assignment.section(QLatin1Char('='), 1);
+    for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources()) {
+        if (source->shortName() == key.section(QLatin1Char('.'), 0, 0))
+            return source->setBridgeValue(
+                    key.section(QLatin1Char('.'), 1),
+                    value.startsWith(QLatin1Char('['))
+                            ? QJsonDocument::fromJson(value.toUtf8()).toVariant()
+                            : QVariant(value));
+    }
+    return false;
 }
 
 inline QStringList activeStates()
@@ -88,6 +113,17 @@ inline QStringList journalLines(qint64 since, const QStringList &kinds = {})
                 }
     }
     return lines;
+}
+
+// The same lines in brief: views and popups by view name ("popup-request IncomingCall") and
+// bridge commands as "bridge phone.endCall", without their arguments.
+inline QStringList briefJournalLines(qint64 since, const QStringList &kinds)
+{
+    static const QRegularExpression module(QStringLiteral("^(view\\S*|popup-\\w+) \\w+\\."));
+    static const QRegularExpression command(QStringLiteral("^(\\w+\\.\\w+)\\(.*\\)$"));
+    return journalLines(since, kinds)
+            .replaceInStrings(module, QStringLiteral("\\1 "))
+            .replaceInStrings(command, QStringLiteral("bridge \\1"));
 }
 
 inline QStringList bridgeCommandsSince(qint64 since)

@@ -3,13 +3,10 @@
 // and commands to the phone. Minutes pass on the simulator's virtual clock.
 
 #include "globalhmi.h"
-#include "hmiphonecontroller.h"
-#include "metainvoke.h"
 #include "virtualeventdispatcher.h"
 
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewmanager.h>
-#include <mavrosk/datasource.h>
 #include <quorvel/hmiviewstate.h>
 
 // A row a line: name | the phone before ("nobar": a host without a status bar) | what happens |
@@ -154,41 +151,23 @@ void TestConnection::play(const QString &step)
     auto *clock = Simulator::VirtualEventDispatcher::instance();
     const qint64 since = GlobalHmi::mark();
     const QString value = step.section(QLatin1Char('='), 1);
-    const QString name = step.section(QRegularExpression(QStringLiteral("[.!=]")), 0, 0);
-    QObject *object = name == QLatin1String("controller")
-            ? m_hmi->host().integration()->findChild<HmiPhone::HmiPhoneController *>()
-            : nullptr;
-    for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources())
-        object = source->shortName() == name ? source : object;
-    const QString member = step.section(QRegularExpression(QStringLiteral("[.!=(]")), 1, 1);
-    QString error;
     if (step.startsWith(QLatin1Char('+'))) {
         for (int minute = 0; minute < step.toInt(); ++minute)
             play(QStringLiteral("tick"));
         return;
     } else if (step == QLatin1String("tick")) {
         clock->advance(60000);
-    } else if (name == QLatin1String("bar")) {
+    } else if (step.startsWith(QLatin1String("bar="))) {
         Brisken::DataStore::get<Brisken::StatusBarController>(QStringLiteral("StatusBarController"))
                 ->setStatusBarVisible(value == QLatin1String("1"));
-    } else if (name == QLatin1String("context")) {
+    } else if (step.startsWith(QLatin1String("context="))) {
         Brisken::DataStore::get<Brisken::ViewManager>(QStringLiteral("ViewManager"))
                 ->setDisplayContext(value.toInt());
     } else if (step.startsWith(QLatin1String("view "))) {
         auto *machine = Quorvel::StateMachine::instance();
         machine->goToState(new Quorvel::HmiViewState(step.mid(5), machine->screensState()));
-    } else if (step.contains(QLatin1Char('!'))) {
-        const QString argument = step.section(QRegularExpression(QStringLiteral("[()]")), 1, 1);
-        QVERIFY2(Simulator::invokeByName(object, member,
-                                         argument.isEmpty() ? QVariantList()
-                                                            : QVariantList{argument.toInt()},
-                                         QMetaMethod::Signal, &error),
-                 qPrintable(step + QLatin1Char(' ') + error));
-    } else if (object) {
-        QVERIFY2(qobject_cast<Mavrosk::DataSource *>(object)->setBridgeValue(member, value),
-                 qPrintable(step));
     } else {
-        Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(step));
+        m_hmi->apply(step);
     }
     TestSupport::processUntilIdle();
 

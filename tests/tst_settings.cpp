@@ -70,12 +70,11 @@ void TestSettings::play(const QString &step)
     } else if (step.startsWith(QLatin1String("intent:"))) {
         Taldris::HmiIntentManager::instance()->requestAction(value.toInt(), {});
     } else if (step.startsWith(QLatin1String("status:"))) {
-        GlobalHmi::phone()->setBridgeValue(QStringLiteral("phoneBookStatus"), value.toInt());
+        TestSupport::setBridgeValue(QStringLiteral("phone.phoneBookStatus=") + value);
     } else if (step.startsWith(QLatin1String("dio:"))) {
         emit Mavrosk::ProjectionSource::instance()->projectionDIONotActive(value.toInt());
     } else if (step == QLatin1String("disconnect")) {
-        Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceConnected"),
-                                                             false);
+        TestSupport::setBridgeValue(QStringLiteral("bluetooth.deviceConnected=false"));
     } else {
         // The settings pages' events by short names; any other word is an event name itself.
         static const QHash<QString, QString> pageEvents{
@@ -154,8 +153,7 @@ void TestSettings::settings()
     QStringList played = steps.split(QLatin1Char(' '), Qt::SkipEmptyParts);
     while (!played.isEmpty() && played.first().contains(QLatin1Char('='))) {
         const QString value = played.takeFirst();
-        QVERIFY(Mavrosk::BluetoothSource::instance()->setBridgeValue(
-                value.section(QLatin1Char('='), 0, 0), value.section(QLatin1Char('='), 1)));
+        QVERIFY(TestSupport::setBridgeValue(QStringLiteral("bluetooth.") + value));
     }
     QVERIFY(m_hmi->run());
     const qint64 since = GlobalHmi::mark();

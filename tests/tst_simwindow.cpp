@@ -203,13 +203,8 @@ void TestSimWindow::popupButtonCallsItsSlot()
     const qint64 before = Platform::Journal::instance()->lastSequence();
     QVERIFY(QMetaObject::invokeMethod(button, "clicked"));
     m_clock->runUntilIdle();
-    QStringList posted;
-    for (const Platform::JournalEntry &entry :
-         Platform::Journal::instance()->entriesSince(before)) {
-        if (entry.kind == QLatin1String("event"))
-            posted.append(entry.fields.value(QStringLiteral("name")).toString());
-    }
-    QCOMPARE(posted, QStringList{event});
+    QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"), before),
+             QStringList{event});
 }
 
 void TestSimWindow::everyViewLoads_data()

@@ -310,7 +310,8 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
     // Adding a phone: from the phone's screens, or when the voice system asks for the pairing.
     chart.event(Events::HmiPhone_AddPhoneRequest, phoneCmp).run(&H::addPhoneRequested).list(7);
     chart.signal(m_speechSource, &Mavrosk::SpeechSource::displayPairingPopup).voiceEvent()
-            .run(Taldris::HmiIntentRequest(14, {ModuleName}, false, true, QVariant())).list(8);
+            .run(Taldris::HmiIntentRequest(IntentAction::PairPhone, {ModuleName}, false, true,
+                                           QVariant())).list(8);
 
     chart.event(Events::HmiPhone_EndCallRequest).run(&H::endCall).list(9);
 

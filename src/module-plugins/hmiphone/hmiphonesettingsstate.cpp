@@ -3,6 +3,7 @@
 #include "hmiphonecontroller.h"
 #include "hmiphoneevents.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
 #include <brisken/requestpopup.h>
@@ -24,14 +25,6 @@
 namespace HmiPhone {
 
 namespace {
-
-// The Bluetooth screens of other modules that take over when the phone settings cannot be shown.
-enum HandOverAction {
-    NoDevicesAction = 14,
-    BluetoothOffAction = 13,
-    NoDeviceConnectedAction = 15,
-};
-const int PhoneBookStatusCheckAction = 67;
 
 // A page opened by an event while the settings are active: a targetless transition of the
 // settings state whose firing requests the page's view.
@@ -107,8 +100,8 @@ HmiPhoneSettingsState::HmiPhoneSettingsState(HmiPhoneController *controller,
             Mavrosk::PhoneSource::instance(), "phoneBookStatus", this);
     phoneBookStatusTransition->setAllowTransitionDefault(true);
     connect(phoneBookStatusTransition, &QAbstractTransition::triggered, phoneBookStatusTransition,
-            Taldris::HmiIntentRequest(PhoneBookStatusCheckAction, QVariantList(), false, false,
-                                      QVariant()));
+            Taldris::HmiIntentRequest(IntentAction::PhoneBookStatusCheck, QVariantList(), false,
+                                      false, QVariant()));
 
     setInitialHmiState(m_entryConditionalState);
 
@@ -123,16 +116,18 @@ HmiPhoneSettingsState::HmiPhoneSettingsState(HmiPhoneController *controller,
     disconnected->setTargetState(hostInitialState);
 }
 
+// With no device, the Bluetooth module off or no phone connected, the Bluetooth screens of other
+// modules take over from the phone settings.
 void HmiPhoneSettingsState::chooseTargetState()
 {
     auto *bluetooth = Mavrosk::BluetoothSource::instance();
     int handOver = 0;
     if (bluetooth->deviceListCount() <= 0)
-        handOver = NoDevicesAction;
+        handOver = IntentAction::PairPhone;
     else if (bluetooth->moduleStatus() == 0)
-        handOver = BluetoothOffAction;
+        handOver = IntentAction::BluetoothModuleOff;
     else if (!bluetooth->deviceConnected())
-        handOver = NoDeviceConnectedAction;
+        handOver = IntentAction::BluetoothDevices;
 
     if (!handOver) {
         m_entryConditionalState->setTargetState(m_phoneSettingsViewState);

@@ -12,6 +12,7 @@
 #include <quorvel/hmitransition.h>
 #include <quorvel/hmiviewstate.h>
 #include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
 
 #include <QEvent>
 
@@ -28,9 +29,6 @@ enum RecentCallListStatus {
     ListRetryError = 5,
     ListDownloadFailedFinal = 6,
 };
-
-// The framework event whose entries keep the list type the driver chose.
-const QEvent::Type KeepListTypeEventType = static_cast<QEvent::Type>(1263);
 
 } // namespace
 
@@ -110,7 +108,8 @@ void RecentCallsViewState::onEntry(QEvent *event)
     if (!popup.isEmpty())
         Brisken::RequestPopup(popup, QVariant())();
 
-    if (!event || event->type() != KeepListTypeEventType)
+    // A return by the back event keeps the list type the driver chose.
+    if (!event || event->type() != Quorvel::StateMachine::BackEventType)
         m_phoneSource->setCurrentRecentCallListType(0);
 
     downloadCallsIfAvailable();
