@@ -108,11 +108,7 @@ public:
 
     static bool isActive(const QString &stateName)
     {
-        for (QAbstractState *state : Quorvel::StateMachine::instance()->configuration()) {
-            if (state->objectName() == stateName)
-                return true;
-        }
-        return false;
+        return TestSupport::activeStates().contains(stateName);
     }
 
 private:
