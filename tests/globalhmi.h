@@ -108,14 +108,20 @@ public:
 
     static bool isActive(const QString &stateName)
     {
-        for (QAbstractState *state : Quorvel::StateMachine::instance()->configuration()) {
-            if (state->objectName() == stateName)
-                return true;
-        }
-        return false;
+        return TestSupport::activeStates().contains(stateName);
     }
 
 private:
     std::unique_ptr<HmiPhoneModule> m_module;
     Host::ModuleHost m_host; // destroyed first: the machine, then the integration
+};
+
+// The fixture of the suites on the whole module: a clean GlobalHmi for each test.
+class GlobalSuite : public TestSupport::Suite
+{
+protected:
+    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
+    void tearDown() override { m_hmi.reset(); }
+
+    std::unique_ptr<GlobalHmi> m_hmi;
 };

@@ -15,6 +15,8 @@
 #include <QStringList>
 #include <QTest>
 
+#include <utility>
+
 // Test data written as plain literals.
 inline QString operator""_q(const char *text, size_t size)
 {
@@ -144,20 +146,15 @@ public:
         if (previous != &handle)
             s_previous = previous;
         take();
-        expected().clear();
+        s_expected.clear();
     }
     // A watched message the test expects: it is not recorded (once per call).
     static void expect(QtMsgType type, const QRegularExpression &pattern)
     {
-        expected().append({type, pattern});
+        s_expected.append({type, pattern});
     }
     // Returns the recorded warnings and forgets them.
-    static QStringList take()
-    {
-        QStringList taken = warnings();
-        warnings().clear();
-        return taken;
-    }
+    static QStringList take() { return std::exchange(s_warnings, {}); }
 
 private:
     struct Expected
@@ -165,16 +162,8 @@ private:
         QtMsgType type;
         QRegularExpression pattern;
     };
-    static QStringList &warnings()
-    {
-        static QStringList list;
-        return list;
-    }
-    static QList<Expected> &expected()
-    {
-        static QList<Expected> list;
-        return list;
-    }
+    static inline QStringList s_warnings;
+    static inline QList<Expected> s_expected;
     static bool watched(QtMsgType type, const QMessageLogContext &context, const QString &message)
     {
         if (type != QtWarningMsg && type != QtCriticalMsg)
@@ -197,14 +186,14 @@ private:
     {
         if (watched(type, context, message)) {
             int index = 0;
-            while (index < expected().size()
-                   && (expected().at(index).type != type
-                       || !expected().at(index).pattern.match(message).hasMatch()))
+            while (index < s_expected.size()
+                   && (s_expected.at(index).type != type
+                       || !s_expected.at(index).pattern.match(message).hasMatch()))
                 ++index;
-            if (index < expected().size())
-                expected().removeAt(index);
+            if (index < s_expected.size())
+                s_expected.removeAt(index);
             else
-                warnings().append(message);
+                s_warnings.append(message);
         }
         if (s_previous)
             s_previous(type, context, message);

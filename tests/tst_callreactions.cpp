@@ -13,13 +13,10 @@
 using namespace HmiPhone;
 using Outputs = QStringList;
 
-class TestCallReactions : public TestSupport::Suite
+class TestCallReactions : public GlobalSuite
 {
     Q_OBJECT
 
-protected:
-    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
-    void tearDown() override;
 private slots:
 
     void incomingCall_data();
@@ -43,14 +40,7 @@ private slots:
 
 private:
     Mavrosk::PhoneSource *phone() const { return GlobalHmi::phone(); }
-
-    std::unique_ptr<GlobalHmi> m_hmi;
 };
-
-void TestCallReactions::tearDown()
-{
-    m_hmi.reset();
-}
 
 void TestCallReactions::incomingCall_data()
 {

@@ -91,7 +91,7 @@ const char *const names[][2] = {
         {"$pbInitiated", "PhonebookDownloadInitiated"},
 };
 
-class TestConnection : public TestSupport::Suite
+class TestConnection : public GlobalSuite
 {
     Q_OBJECT
 
@@ -102,7 +102,6 @@ private slots:
 private:
     void play(const QString &step);
 
-    std::unique_ptr<GlobalHmi> m_hmi;
     QStringList m_outputs;
     qint64 m_start = 0; // the virtual time the row's steps began
     qint64 m_minute = 0; // the last minute marked in the outputs
@@ -131,7 +130,6 @@ void TestConnection::reactions()
     QFETCH(QStringList, setup);
     QFETCH(QStringList, steps);
     QFETCH(QStringList, outputs);
-    m_hmi = std::make_unique<GlobalHmi>();
     if (setup.removeAll(QStringLiteral("nobar")))
         Brisken::DataStore::remove(QStringLiteral("StatusBarController"));
     QVERIFY(m_hmi->run());
@@ -142,7 +140,6 @@ void TestConnection::reactions()
     m_minute = 0;
     for (const QString &step : steps)
         play(step);
-    m_hmi.reset();
     QCOMPARE(m_outputs, outputs);
 }
 

@@ -29,13 +29,10 @@ QStringList popupRequestsSince(qint64 since)
 
 } // namespace
 
-class TestGlobalGuards : public TestSupport::Suite
+class TestGlobalGuards : public GlobalSuite
 {
     Q_OBJECT
 
-protected:
-    void setUp() override { m_hmi = std::make_unique<GlobalHmi>(); }
-    void tearDown() override;
 private slots:
 
     void incomingCall_data();
@@ -44,38 +41,26 @@ private slots:
     void incomingCallAfterProjection();
     void callConnected_data();
     void callConnected();
-
-private:
-    std::unique_ptr<GlobalHmi> m_hmi;
 };
-
-void TestGlobalGuards::tearDown()
-{
-    m_hmi.reset();
-}
 
 void TestGlobalGuards::incomingCall_data()
 {
     QTest::addColumn<int>("projectionMode");
     QTest::addColumn<bool>("rendering");
-    QTest::addColumn<bool>("doNotDisturb");
     QTest::addColumn<bool>("popup");
 
-    QTest::addRow("no projection") << 0 << false << false << true;
-    QTest::addRow("projection 1, not rendering") << 1 << false << false << false;
-    QTest::addRow("projection 1, rendering") << 1 << true << false << true;
-    QTest::addRow("projection 2, not rendering") << 2 << false << false << true;
-    QTest::addRow("do not disturb") << 0 << false << true << false;
+    QTest::addRow("no projection") << 0 << false << true;
+    QTest::addRow("projection 1, not rendering") << 1 << false << false;
+    QTest::addRow("projection 1, rendering") << 1 << true << true;
+    QTest::addRow("projection 2, not rendering") << 2 << false << true;
 }
 
 void TestGlobalGuards::incomingCall()
 {
     QFETCH(int, projectionMode);
     QFETCH(bool, rendering);
-    QFETCH(bool, doNotDisturb);
     QFETCH(bool, popup);
     setProjection(projectionMode, rendering);
-    phone()->setDoNotDisturb(doNotDisturb);
     QVERIFY(m_hmi->run());
 
     const qint64 since = GlobalHmi::mark();

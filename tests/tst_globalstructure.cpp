@@ -215,33 +215,21 @@ QString describe(QAbstractTransition *transition)
 
 } // namespace
 
-class TestGlobalStructure : public TestSupport::Suite
+class TestGlobalStructure : public GlobalSuite
 {
     Q_OBJECT
 
 protected:
-    void setUp() override;
-    void tearDown() override;
+    void setUp() override
+    {
+        GlobalSuite::setUp();
+        QVERIFY(m_hmi->setUp());
+    }
 private slots:
-
     void popupList();
     void transitionList();
     void guardsFindTheirTransitions();
-
-private:
-    std::unique_ptr<GlobalHmi> m_hmi;
 };
-
-void TestGlobalStructure::setUp()
-{
-    m_hmi = std::make_unique<GlobalHmi>();
-    QVERIFY(m_hmi->setUp());
-}
-
-void TestGlobalStructure::tearDown()
-{
-    m_hmi.reset();
-}
 
 void TestGlobalStructure::popupList()
 {

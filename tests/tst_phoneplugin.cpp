@@ -187,6 +187,25 @@ private slots:
                    })
                 << QStringLiteral("HmiPhoneSettingsHostedSubmodule: the controller is gone, the "
                                   "settings pages cannot stop a ringtone sample");
+        const auto ringingKey = [](int key) {
+            return std::function<void()>([key] {
+                Mavrosk::PhoneSource::instance()->setBridgeValue(QStringLiteral("incomingCall"),
+                                                                 true);
+                TestSupport::processUntilIdle();
+                Mavrosk::KeySource::instance()->sendKeyEvent(key, 1);
+            });
+        };
+        QTest::newRow("accept key while ringing")
+                << ringingKey(77)
+                << QStringLiteral("HmiPhoneGlobalStateHandler: the controller is gone, the call "
+                                  "is not answered");
+        QTest::newRow("reject key while ringing")
+                << ringingKey(78)
+                << QStringLiteral("HmiPhoneGlobalStateHandler: the controller is gone, the call "
+                                  "is not answered");
+        QTest::newRow("end key opens no phone") << std::function<void()>([] {
+            Mavrosk::KeySource::instance()->sendKeyEvent(50, 1);
+        }) << QString();
         QTest::newRow("low battery guard") << std::function<void()>([] {
             Mavrosk::PhoneSource::instance()->setBridgeValue(
                     QStringLiteral("lowBatteryNotification"), true);

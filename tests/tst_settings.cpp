@@ -26,17 +26,16 @@ QString screen()
 
 } // namespace
 
-class TestSettings : public TestSupport::Suite
+class TestSettings : public GlobalSuite
 {
     Q_OBJECT
 
 protected:
     void setUp() override
     {
-        m_hmi = std::make_unique<GlobalHmi>();
+        GlobalSuite::setUp();
         Mavrosk::BluetoothSource::instance()->setBridgeValue(QStringLiteral("deviceListCount"), 1);
     }
-    void tearDown() override { m_hmi.reset(); }
 
 private slots:
     void settings_data();
@@ -44,8 +43,6 @@ private slots:
 
 private:
     void play(const QString &step);
-
-    std::unique_ptr<GlobalHmi> m_hmi;
 };
 
 // One step of a row: "x=v" (a Bluetooth value) before the start; "choose" (the settings menu's

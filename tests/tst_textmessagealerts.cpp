@@ -24,8 +24,6 @@ private slots:
     }
     void textMessages_data();
     void textMessages();
-
-private:
 };
 
 // Each row: bridge values before start, then steps: "@ms" lets time pass up to that moment,

@@ -308,13 +308,12 @@ private slots:
                         new HmiEvent(operation.at(0).toUpper() + operation.mid(1)));
             processUntilIdle();
         }
-        QStringList popupLines;
-        for (const QString &line : TestSupport::journalLines(since,
-                                                             {QStringLiteral("popup-shown"),
-                                                              QStringLiteral("popup-hidden"),
-                                                              QStringLiteral("popup-closed")}))
-            popupLines << QString(line).replace(QLatin1Char(' '), QLatin1Char(':'));
-        QCOMPARE(popupLines, journal);
+        QCOMPARE(TestSupport::journalLines(since,
+                                           {QStringLiteral("popup-shown"),
+                                            QStringLiteral("popup-hidden"),
+                                            QStringLiteral("popup-closed")})
+                         .replaceInStrings(QStringLiteral(" "), QStringLiteral(":")),
+                 journal);
         QCOMPARE(controller->openPopups(), open);
         QCOMPARE(controller->shownPopups(), QStringList{open.last()});
         QVERIFY2(NamedState::stateForName(active)->isActive(), qPrintable(active));

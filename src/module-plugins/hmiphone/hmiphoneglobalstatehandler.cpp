@@ -755,8 +755,8 @@ void HmiPhoneGlobalStateHandler::onMissedCallPopupExited()
 
 void HmiPhoneGlobalStateHandler::addPhoneRequested()
 {
-    Taldris::HmiIntentManager::instance()->requestAction(
-            IntentAction::PairPhone, {QVariant(ModuleName)}, false, false, QVariant());
+    Taldris::HmiIntentManager::instance()->requestAction(IntentAction::PairPhone,
+                                                         {QVariant(ModuleName)});
 }
 
 // Posted through the controller, at normal priority, to the HMI's one machine, like every other

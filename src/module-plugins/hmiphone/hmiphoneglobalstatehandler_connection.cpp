@@ -5,6 +5,7 @@
 #include "hmiphoneglobalstatehandler.h"
 
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
 #include "hmiphoneviews.h"
 
@@ -61,12 +62,6 @@ bool showsReconnectNotice(const QString &viewId)
     return false;
 }
 
-void requestAction(int action)
-{
-    Taldris::HmiIntentManager::instance()->requestAction(action, QVariantList(), false, false,
-                                                         QVariant());
-}
-
 } // namespace
 
 // --- Link loss and reconnection ----------------------------------------------------------------
@@ -81,7 +76,7 @@ void HmiPhoneGlobalStateHandler::handleLinklossReconnectSuccessTransition()
 
 void HmiPhoneGlobalStateHandler::showPhoneConnectSuccessTransient()
 {
-    requestAction(53);
+    Taldris::HmiIntentManager::instance()->requestAction(IntentAction::PhoneConnectSuccess);
 }
 
 void HmiPhoneGlobalStateHandler::showPhoneAttemptingReconnectTransient()
@@ -90,7 +85,8 @@ void HmiPhoneGlobalStateHandler::showPhoneAttemptingReconnectTransient()
     const QString viewId = active ? active->targetView() : QString();
     // Outside the phone's screens the driver is not told of the reconnection attempts.
     if (showsReconnectNotice(viewId))
-        requestAction(61);
+        Taldris::HmiIntentManager::instance()->requestAction(
+                IntentAction::PhoneAttemptingReconnect);
 }
 
 // --- Extended mode -----------------------------------------------------------------------------
@@ -161,10 +157,10 @@ void HmiPhoneGlobalStateHandler::showPhonebookDownloadCompleteTransientMessage()
 
 void HmiPhoneGlobalStateHandler::handlePhonebookDownloadCompleteDisplay()
 {
-    // Display contexts 2 and 6 tell it by the popup, which closes itself; the others by the
-    // transient.
+    // Two display contexts tell it by the popup, which closes itself; the others by the transient.
     const int displayContext = m_viewManager->displayContext();
-    if (displayContext == 2 || displayContext == 6)
+    if (displayContext == DisplayContext::DownloadCompletePopup
+        || displayContext == DisplayContext::DownloadCompletePopupToo)
         m_popupManager->showPhoneBookDownloadCompletePopup();
     else
         showPhonebookDownloadCompleteTransientMessage();

@@ -4,6 +4,7 @@
 #include "hmiphoneglobalstatehandler.h"
 
 #include "hmiphonecontroller.h"
+#include "hmiphoneintegration.h"
 #include "hmiphonenumbers.h"
 #include "hmiphoneviews.h"
 
@@ -44,9 +45,15 @@ bool twoCalls(const Mavrosk::PhoneSource *phone)
 }
 
 // The accept and reject keys answer a waiting call, then a ringing one, through the controller;
-// true when the key was used for that.
+// true when the key was used for that. With the controller gone (QML may delete it) the key is
+// used up without answering.
 bool answer(const Mavrosk::PhoneSource *phone, HmiPhoneController *controller, bool accept)
 {
+    if (!controller && (waitingCall(phone) || phone->incomingCall())) {
+        qCWarning(hmiphone()) << "HmiPhoneGlobalStateHandler: the controller is gone, the call "
+                                 "is not answered";
+        return true;
+    }
     if (waitingCall(phone)) {
         if (accept)
             controller->acceptWaitingCall();
@@ -126,7 +133,7 @@ void HmiPhoneGlobalStateHandler::processPhoneEndRejectKey()
         return;
     if (m_phoneSource->dialingInProgress() || m_phoneSource->callConnected())
         m_phoneSource->endCall();
-    else if (m_phoneSource->status() == CallStatus::NoCall)
+    else if (m_phoneSource->status() == CallStatus::NoCall && m_controller)
         m_controller->jumpToPhoneSection();
 }
 
@@ -164,8 +171,11 @@ void HmiPhoneGlobalStateHandler::processSWCRejectOrSeek()
 {
     if (eventsBlocked())
         return;
-    if (m_phoneSource->incomingCall())
+    if (m_phoneSource->incomingCall() && m_controller)
         m_controller->rejectIncomingCall();
+    else if (m_phoneSource->incomingCall())
+        qCWarning(hmiphone()) << "HmiPhoneGlobalStateHandler: the controller is gone, the call "
+                                 "is not rejected";
     else if (callActivity(m_phoneSource))
         m_phoneSource->endCall();
     else

@@ -2,6 +2,7 @@
 
 #include "hmiphonecontroller.h"
 #include "hmiphoneintegration.h"
+#include "hmiphonenumbers.h"
 #include "hmiphonesettingsstate.h"
 
 #include <brisken/hmiaction.h>
@@ -12,9 +13,8 @@ namespace HmiPhone {
 
 namespace {
 
-// The settings-menu entry's action type and the intent action that opens the phone settings.
+// The settings-menu entry's action type.
 const int SettingsEntryType = 3;
-const int PhoneSettingsAction = 7;
 
 } // namespace
 
@@ -31,7 +31,7 @@ Brisken::HmiAction *HmiPhoneSettingsHostedSubmodule::subModuleEntryAction()
                                           this);
     action->setTranslationContext(QStringLiteral("HmiPhone::HmiPhoneSettingsHostedSubmodule"));
     connect(action, &Brisken::HmiAction::triggered, action,
-            Taldris::IntentActionRequest(PhoneSettingsAction, nullptr));
+            Taldris::IntentActionRequest(IntentAction::PhoneSettings, nullptr));
     action->enabledBinding(Mavrosk::ProjectionSource::instance(),
                            &Mavrosk::ProjectionSource::projectionDIONotActive);
     return action;

@@ -35,12 +35,6 @@ void addPageRequest(Quorvel::HmiState *settings, const QString &event, QAbstract
                      Brisken::RequestView(page, QVariant(), false, QVariant()));
 }
 
-void requestHandOver(int action)
-{
-    Taldris::HmiIntentManager::instance()->requestAction(action, QVariantList(), false, false,
-                                                         QVariant());
-}
-
 } // namespace
 
 HmiPhoneSettingsState::HmiPhoneSettingsState(HmiPhoneController *controller,
@@ -134,7 +128,7 @@ void HmiPhoneSettingsState::chooseTargetState()
         return;
     }
     m_entryConditionalState->setTargetState(m_limboState);
-    requestHandOver(handOver);
+    Taldris::HmiIntentManager::instance()->requestAction(handOver);
 }
 
 void HmiPhoneSettingsState::choosePhoneSettingsTargetState()
