@@ -60,30 +60,14 @@ struct Settings
     QString plugin;
 };
 
-// Makes every source of the data bridge, as a host does before it loads modules.
-void createBridge()
-{
-    Mavrosk::PhoneSource::instance();
-    Mavrosk::EAPhoneSource::instance();
-    Mavrosk::BluetoothSource::instance();
-    Mavrosk::ProjectionSource::instance();
-    Mavrosk::SpeechSource::instance();
-    Mavrosk::KeySource::instance();
-    Mavrosk::NavSource::instance();
-    Mavrosk::GlobalSource::instance();
-    Mavrosk::ArdelSource::instance();
-}
-
 // The floor finds the senders of the module's signal transitions among the bridge's sources (and
 // the bench's own emitter); any other becomes an event transition that never fires.
 std::function<QObject *(const QString &)> senderResolver(QObject *emitter = nullptr)
 {
-    const QList<QObject *> senders{
-            Mavrosk::PhoneSource::instance(),     Mavrosk::EAPhoneSource::instance(),
-            Mavrosk::BluetoothSource::instance(), Mavrosk::ProjectionSource::instance(),
-            Mavrosk::SpeechSource::instance(),    Mavrosk::KeySource::instance(),
-            Mavrosk::NavSource::instance(),       Mavrosk::GlobalSource::instance(),
-            Mavrosk::ArdelSource::instance(),     emitter};
+    QList<QObject *> senders{emitter};
+    const QList<Mavrosk::DataSource *> sources = Mavrosk::createAll();
+    for (Mavrosk::DataSource *source : sources)
+        senders.append(source);
     return [senders](const QString &className) -> QObject * {
         for (QObject *sender : senders) {
             if (sender && QLatin1String(sender->metaObject()->className()) == className)
@@ -224,7 +208,7 @@ std::unique_ptr<Host::ModuleHost> setUpModule(const QString &plugin)
 int coldChild(const QString &side, const Settings &settings, const QString &treeFile)
 {
     Meter meter;
-    createBridge();
+    Mavrosk::createAll();
     double cost = -1;
     if (side == QLatin1String("project")) {
         std::unique_ptr<Host::ModuleHost> host;
@@ -279,7 +263,7 @@ void projectStep(Host::ModuleHost &host, int step)
 
 void startUpAndRuns(Meter &meter, const Settings &settings)
 {
-    createBridge();
+    Mavrosk::createAll();
     // First set-up (cold caches aside): its tree is the floor's.
     std::unique_ptr<Host::ModuleHost> host = setUpModule(settings.plugin);
     const TreeShape shape = TreeShape::capture(Quorvel::StateMachine::instance());

@@ -63,20 +63,6 @@ int logLevel(const QString &name)
     return levels.indexOf(name);
 }
 
-// Makes every source of the data bridge, so that steps find them by their short names.
-void createBridge()
-{
-    Mavrosk::PhoneSource::instance();
-    Mavrosk::EAPhoneSource::instance();
-    Mavrosk::BluetoothSource::instance();
-    Mavrosk::ProjectionSource::instance();
-    Mavrosk::SpeechSource::instance();
-    Mavrosk::KeySource::instance();
-    Mavrosk::NavSource::instance();
-    Mavrosk::GlobalSource::instance();
-    Mavrosk::ArdelSource::instance();
-}
-
 enum class Display { None, Window, Screenshots };
 
 // Read before the application exists: a window needs a GUI application, and on screen the
@@ -297,7 +283,7 @@ int main(int argc, char *argv[])
                                                             : Simulator::OutputWriter::Human);
     output.setSilent(random);
     output.captureLog(ModuleLogCategory, level);
-    createBridge();
+    Mavrosk::createAll(); // steps find the sources by their short names
 
     Host::ModuleHost host;
     const QString pluginFile = parser.value(pluginOption);

@@ -2,10 +2,8 @@
 
 namespace Mavrosk {
 
-void resetAll()
+QList<DataSource *> createAll()
 {
-    // Sources not built yet still hold their initial values; build them all so that the
-    // reset is complete and the order of first use does not matter.
     PhoneSource::instance();
     EAPhoneSource::instance();
     BluetoothSource::instance();
@@ -15,7 +13,14 @@ void resetAll()
     NavSource::instance();
     GlobalSource::instance();
     ArdelSource::instance();
-    const QList<DataSource *> sources = DataSource::sources();
+    return DataSource::sources();
+}
+
+void resetAll()
+{
+    // Sources not built yet still hold their initial values; build them all so that the
+    // reset is complete and the order of first use does not matter.
+    const QList<DataSource *> sources = createAll();
     for (DataSource *source : sources)
         source->reset();
 }

@@ -113,6 +113,9 @@
 
 namespace Mavrosk {
 
+// Makes every source of the bridge, as a host does before it loads modules, and returns them.
+QList<DataSource *> createAll();
+
 // Puts every source and list model back to the values of a head unit with no phone.
 void resetAll();
 
