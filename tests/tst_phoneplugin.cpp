@@ -107,35 +107,52 @@ private slots:
         QCOMPARE(root->parentState(), m_host->moduleParent());
 
         const QStringList expected
-                = QStringLiteral(
-                          "PhoneCallCmp PhoneCallCmp/CallInProgressViewState "
-                          "PhoneCallCmp/KeypadInCallViewState "
-                          "PhoneBookCmp PhoneBookCmp/PhoneBookEmptyViewState "
-                          "PhoneBookCmp/PhoneBookListViewState "
-                          "PhoneBookCmp/PhoneBookSearchViewState "
-                          "PhoneBookCmp/ContactDetailsViewState "
-                          "PhoneBookCmp/PhoneBook_CmpConditionalState PhoneEmgcyAsst "
-                          "PhoneStatusAlertsCmp "
-                          "HmiPhone_Limbo PhoneMenuViewState DialKeypadViewState "
-                          "RecentCallsListViewState "
-                          "RecentCallsListViewState/RecentCallsListViewStateView "
-                          "RecentCallsListViewState/%1 RecentCallsListViewState/%2 "
-                          "RecentCallsListViewState/%3 "
-                          "RecentCallsListViewState/%4 Phone_CmpConditionalState PhoneSmsCmp "
-                          "PhoneSmsCmp/PhoneSmsListViewState "
-                          "PhoneSmsCmp/PhoneSmsReplyListViewState "
-                          "PhoneSmsCmp/PhoneSmsViewState %5 %6 %7 %8 %9 %10 %11")
-                          .arg(Views::RecentCallsDownloading, Views::RecentCallsDownloadFailed,
-                               Views::RecentCallsRetryError, Views::RecentCallsFailedCallKOVA,
-                               Views::PhoneDndActiveArdel, Views::PhoneSmsNotSupported,
-                               Views::PhoneSmsWaitingForResponseFromPhone,
-                               Views::PhoneSmsAccessNotGranted, Views::PhoneSmsDownloading)
-                          .arg(Views::PhoneSmsDownloadFailed, Views::PhoneSmsRetryDownloadFailed)
+                = QStringLiteral("PhoneCallCmp PhoneCallCmp/CallInProgressViewState "
+                                 "PhoneCallCmp/KeypadInCallViewState "
+                                 "PhoneBookCmp PhoneBookCmp/PhoneBookEmptyViewState "
+                                 "PhoneBookCmp/PhoneBookListViewState "
+                                 "PhoneBookCmp/PhoneBookSearchViewState "
+                                 "PhoneBookCmp/ContactDetailsViewState "
+                                 "PhoneBookCmp/PhoneBook_CmpConditionalState PhoneEmgcyAsst "
+                                 "PhoneStatusAlertsCmp "
+                                 "HmiPhone_Limbo PhoneMenuViewState DialKeypadViewState "
+                                 "RecentCallsListViewState "
+                                 "RecentCallsListViewState/RecentCallsListViewStateView "
+                                 "Phone_CmpConditionalState PhoneSmsCmp "
+                                 "PhoneSmsCmp/PhoneSmsListViewState "
+                                 "PhoneSmsCmp/PhoneSmsReplyListViewState "
+                                 "PhoneSmsCmp/PhoneSmsViewState")
                           .split(QLatin1Char(' '));
         const QStringList components{QStringLiteral("PhoneCallCmp"), QStringLiteral("PhoneBookCmp"),
                                      QStringLiteral("RecentCallsListViewState"),
                                      QStringLiteral("PhoneSmsCmp")};
         QCOMPARE(tree(root, components), expected);
+
+        // The layers' popups open in their layered states' regions; closed, they wait outside
+        // the tree.
+        auto *machine = Quorvel::StateMachine::instance();
+        auto layerPopups = [machine](const QString &layered) {
+            QStringList ids;
+            const QState *region
+                    = machine->findChild<Quorvel::HmiLayeredState *>(layered)->layerState();
+            for (const Quorvel::PopupState *popup : machine->regionPopups(region))
+                ids.append(popup->viewId());
+            return ids;
+        };
+        QStringList rootPopups{Views::PhoneDndActiveArdel,
+                               Views::PhoneSmsNotSupported,
+                               Views::PhoneSmsWaitingForResponseFromPhone,
+                               Views::PhoneSmsAccessNotGranted,
+                               Views::PhoneSmsDownloading,
+                               Views::PhoneSmsDownloadFailed,
+                               Views::PhoneSmsRetryDownloadFailed};
+        QStringList recentCallsPopups{
+                Views::RecentCallsDownloading, Views::RecentCallsDownloadFailed,
+                Views::RecentCallsRetryError, Views::RecentCallsFailedCallKOVA};
+        rootPopups.sort();
+        recentCallsPopups.sort();
+        QCOMPARE(layerPopups(root->objectName()), rootPopups);
+        QCOMPARE(layerPopups(QStringLiteral("RecentCallsListViewState")), recentCallsPopups);
 
         // The contacts popups are handed to the root of the machine, not kept in the phone's tree.
         for (const QString &popup :

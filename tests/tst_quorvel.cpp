@@ -139,7 +139,8 @@ private slots:
 
         for (const char *name : {"StateLevel1", "StateLevel2", "StateLevel3", "Screens", "Home"})
             QVERIFY2(active(QLatin1String(name)), name);
-        QCOMPARE(tree.popup->parentState()->parentState(), tree.machine->popupRegion());
+        QCOMPARE(tree.machine->regionPopups(tree.machine->popupRegion()),
+                 QList<PopupState *>{tree.popup});
         QCOMPARE(adopted->adoptedLevel(), StateLevel2);
         QVERIFY(adopted->isAdopted());
         // A waiting adopted transition lies on no active state: other notifications never

@@ -114,7 +114,7 @@ void TestSettings::settings_data()
     // The pages open only while the settings are active; back returns to the page before.
     row("manage contacts, back", "choose contacts back", "PhoneSettings", "intent 7()");
     row("delete all contacts", "choose contacts delete-all", "PhoneManageContactsSettings PhoneDeleteAllContactsPopup", "intent 7()");
-    row("delete all on the settings page", "choose delete-all", "PhoneSettings", "intent 7()");
+    row("delete all on the settings page: over it", "choose delete-all", "PhoneSettings PhoneDeleteAllContactsPopup", "intent 7()");
     row("message notifications, back", "choose messages back", "PhoneSettings", "intent 7()");
     row("capital Request: no page", "choose HmiPhone_RequestPhoneTextMessageNotificationSettingsPage", "PhoneSettings", "intent 7()");
     row("outside: manage contacts", "contacts", "HOST.Home", "");

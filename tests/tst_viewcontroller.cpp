@@ -153,8 +153,10 @@ private slots:
         row("re-request moves up among equals", "+A +B +A", "A", "B A");
         row("dismissing the top reveals the next", "+A +B -B", "A", "A");
         row("dismissing below keeps the top", "+A +B -A", "B", "B");
-        row("unknown identifier: recorded only", "+Nowhere", "", "");
-        row("layer inactive: not shown", "+Layer go:Menu", "", "");
+        row("unknown identifier: dropped, and said", "+Nowhere", "", "");
+        row("layer inactive: opens over the screen shown", "+Layer", "Layer", "Layer");
+        row("... stays while its layer is entered", "+Layer go:Menu", "Layer", "Layer");
+        row("... closes when its layer, once entered, is left", "+Layer go:Menu go:Home", "", "");
         row("layer active: shown beside the global one", "go:Menu +Layer +A", "A Layer", "A");
         row("leaving the layer closes its popups", "go:Menu +Layer go:Home go:Menu", "", "");
         // clang-format on
@@ -172,9 +174,12 @@ private slots:
             const QString name = operation.mid(1);
             if (operation.startsWith(QLatin1String("go:")))
                 screens.goTo(operation.mid(3));
-            else if (operation.startsWith(QLatin1Char('+')))
+            else if (operation == QLatin1String("+Nowhere"))
+                expectMessage(QtWarningMsg,
+                              QRegularExpression(QStringLiteral("T.Nowhere dropped")));
+            if (operation.startsWith(QLatin1Char('+')))
                 controller->requestPopup(id(name.toLatin1().constData()));
-            else
+            else if (operation.startsWith(QLatin1Char('-')))
                 controller->dismissPopup(id(name.toLatin1().constData()));
             processUntilIdle();
         }
@@ -185,6 +190,8 @@ private slots:
                 requested << id(operation.mid(1).toLatin1().constData());
         }
         QCOMPARE(journalValues(QStringLiteral("popup-request")), requested);
+        QCOMPARE(journalValues(QStringLiteral("popup-dropped")),
+                 requested.filter(QStringLiteral("Nowhere")));
     }
 
     // A state entering may ask for a popup of its own layer.

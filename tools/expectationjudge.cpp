@@ -6,6 +6,7 @@
 #include <brisken/datastore.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
+#include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 
 #include <QAbstractState>
@@ -18,6 +19,19 @@ namespace {
 
 // Checks whose value is a name of what is on screen, not a value name.
 const char *const ScreenChecks[] = {"view", "popup", "nopopup", "top", "state"};
+
+// The framework's places for popups in a region (a leaf below a region and above any popup) say
+// nothing about what is shown.
+bool isPopupPlace(const QAbstractState *state, const QList<QState *> &regions)
+{
+    for (const QObject *each = state; each; each = each->parent()) {
+        if (qobject_cast<const Quorvel::PopupState *>(each))
+            return false;
+        if (regions.contains(static_cast<QState *>(const_cast<QObject *>(each))))
+            return true;
+    }
+    return false;
+}
 
 QString compact(const QJsonObject &object)
 {
@@ -109,6 +123,7 @@ QString checkScreen(const QString &key, const QString &wanted, bool negated)
     QStringList active;
     bool found = false;
     if (auto *machine = Quorvel::StateMachine::existingInstance()) {
+        const QList<QState *> regions = machine->popupRegions();
         for (QAbstractState *state : machine->findChildren<QAbstractState *>()) {
             if (!state->active())
                 continue;
@@ -118,10 +133,7 @@ QString checkScreen(const QString &key, const QString &wanted, bool negated)
             for (QAbstractState *child :
                  state->findChildren<QAbstractState *>(QString(), Qt::FindDirectChildrenOnly))
                 activeChild = activeChild || child->active();
-            // A closed popup's place in its region says nothing: leave it out.
-            const bool closedPopup = state->objectName().endsWith(QLatin1String("Closed"))
-                    && state->parent()->objectName().endsWith(QLatin1String("Slot"));
-            if (!activeChild && !closedPopup)
+            if (!activeChild && !isPopupPlace(state, regions))
                 active.append(state->objectName());
         }
     }

@@ -26,6 +26,7 @@ struct JournalEntry
 //   popup-shown {id}          popup-hidden {id}       what the framework did: the popup on top
 //                                                     of its region changed
 //   popup-closed {id}         a popup closed while covered by another
+//   popup-dropped {id, reason} a popup request the framework could not honour
 //   transient {name, value}   transient-hide {name}
 //   back {steps}
 //   intent {action, args}     hardkey {call}

@@ -9,9 +9,9 @@
 //   deepest active exclusive ancestor of the target as an internal transition, so that it
 //   leaves only what lies below that state and no popup closes;
 // - a transition that leaves an open popup (its source is the popup or one of the popup's
-//   states, its target lies outside the popup): to its target's domain in the same way, while
-//   the popup's slot closes the popup in the same step. Under Qt's own rules its domain would
-//   be the whole root layer, and every popup and screen would close.
+//   states, its target lies outside the popup), or enters a closed one: to its target's domain
+//   in the same way, while the left popup's holder closes it in the same step. Under Qt's own
+//   rules its domain would be the whole root layer, and every popup and screen would close.
 
 namespace Quorvel {
 
@@ -41,8 +41,21 @@ void StateMachinePrivate::placeForTurn(HmiAbstractTransition *transition, QEvent
 {
     parkMovedTransition();
     QAbstractState *target = transition->targetState();
+    if (!target || (!transition->m_adopted && !isActive(transition->sourceState())))
+        return;
+    // A target inside a closed popup: the popup is put where it opens, as a request would put it,
+    // and the transition enters it there.
+    PopupState *opening = enclosingPopup(target);
+    if (opening && !isActive(opening)) {
+        PopupRegion *region = regionOf(opening);
+        if (!region || !isActive(region))
+            return;
+        placePopup(opening, region, nullptr);
+    } else {
+        opening = nullptr;
+    }
     if (transition->m_adopted) {
-        QState *domain = target ? domainFor(target) : nullptr;
+        QState *domain = domainFor(target);
         if (domain)
             transition->setTransitionType(QAbstractTransition::InternalTransition);
         else
@@ -50,20 +63,19 @@ void StateMachinePrivate::placeForTurn(HmiAbstractTransition *transition, QEvent
         moveForTurn(transition, domain);
         return;
     }
-    PopupState *popup = target ? enclosingPopup(transition->sourceState()) : nullptr;
-    if (!popup || isWithin(target, popup) || !isActive(transition->sourceState()))
+    PopupState *leaving = enclosingPopup(transition->sourceState());
+    if (leaving && isWithin(target, leaving))
+        leaving = nullptr;
+    if (!leaving && !opening)
         return;
     QState *domain = domainFor(target);
-    PopupSlot *slot = slotOf(popup);
-    if (!domain || !slot)
+    if (!domain)
         return;
     moveForTurn(transition, domain);
     transition->setTransitionType(QAbstractTransition::InternalTransition);
-    // A domain above the popup leaves it anyway.
-    if (!isWithin(slot, domain)) {
-        slot->mover()->arm(fire, slot->closedState());
-        armedSlots.append(slot);
-    }
+    // A domain above the popup left leaves it anyway.
+    if (leaving && !isWithin(leaving->m_holder, domain))
+        closeInStep(leaving, fire);
 }
 
 void StateMachinePrivate::moveForTurn(HmiAbstractTransition *transition, QState *domain)

@@ -28,6 +28,7 @@ const int TriggeredSignal = QMetaMethod::fromSignal(&QAbstractTransition::trigge
 const QEvent::Type FireEvent::s_type = registeredType();
 const QEvent::Type RouteEvent::s_type = registeredType();
 const QEvent::Type PopupSyncEvent::s_type = registeredType();
+const QEvent::Type PopupAnsweredEvent::s_type = registeredType();
 
 FireEvent::FireEvent(const FireTurn &turn, quint64 batch, bool last)
     : QEvent(eventType())
@@ -39,6 +40,11 @@ FireEvent::FireEvent(const FireTurn &turn, quint64 batch, bool last)
 RouteEvent::RouteEvent(QAbstractState *target, QEvent::Type type)
     : QEvent(type == QEvent::None ? eventType() : type)
     , target(target)
+{ }
+
+PopupAnsweredEvent::PopupAnsweredEvent(const QString &viewId)
+    : QEvent(eventType())
+    , viewId(viewId)
 { }
 
 PopupSyncEvent::PopupSyncEvent(PopupRegion *region)
@@ -278,9 +284,12 @@ void StateMachinePrivate::finishBatch()
 //    made (finishBatch); each changes a region's stack and asks for that region's
 //    PopupSyncEvent.
 // 4. A PopupSyncEvent opens and closes the region's popups as its stack says, all in one step
-//    (syncRegion); which popup is on top is reported when the step ends.
+//    (syncRegion); which popup is on top is reported when the step ends, and the popups that
+//    closed are parked (settlePopups).
 // 5. A RouteEvent (or a back event) moves to a state through the router transition placed on
 //    the target's domain.
+// 6. A PopupAnsweredEvent, posted at normal priority when the driver answered a popup, closes
+//    the popup if the module leaves its closing to the framework and it is still open.
 // Popup requests and dismissals made while the machine enters or leaves states outside a batch
 // (entry and exit slots, steps 4 and 5) take effect when that step ends (endMicrostep).
 void StateMachinePrivate::beginSelect(QEvent *event)
@@ -294,7 +303,7 @@ void StateMachinePrivate::beginSelect(QEvent *event)
         return;
     // Whatever was armed or moved for the previous event was taken by its step and put back.
     Q_ASSERT(!router->isArmed());
-    Q_ASSERT(armedSlots.isEmpty());
+    Q_ASSERT(armedMovers.isEmpty());
     Q_ASSERT(!armedTransition);
 
     if (type == FireEvent::eventType()) {
@@ -313,6 +322,8 @@ void StateMachinePrivate::beginSelect(QEvent *event)
     } else if (type == PopupSyncEvent::eventType()) {
         if (PopupRegion *region = static_cast<PopupSyncEvent *>(event)->region)
             syncRegion(region, event);
+    } else if (type == PopupAnsweredEvent::eventType()) {
+        closeAnsweredPopup(static_cast<PopupAnsweredEvent *>(event)->viewId);
     } else if (auto *routeEvent = dynamic_cast<RouteEvent *>(event)) {
         // Either type: a back event posted by someone else is no route.
         route(event, routeEvent->target);
@@ -340,9 +351,10 @@ void StateMachinePrivate::endMicrostep()
         router->disarm();
         q->addTransition(router);
     }
-    for (PopupSlot *slot : qAsConst(armedSlots))
-        slot->mover()->disarm();
-    armedSlots.clear();
+    for (ArmedTransition *mover : qAsConst(armedMovers))
+        mover->disarm();
+    armedMovers.clear();
+    settlePopups();
     reportTops();
     if (!currentBatch && !microstepOps.isEmpty()) {
         const QList<PopupOp> ops = microstepOps;

@@ -12,6 +12,7 @@ class QTimer;
 namespace Quorvel {
 
 class HmiLayeredState;
+class PopupHolder;
 
 // The state of a popup, named by its view identifier. A popup with a layer lives in that
 // layered state's layer region; one without joins the global popup region when the host
@@ -61,12 +62,17 @@ protected:
     void onExit(QEvent *event) override;
 
 private:
+    friend class StateMachine;
     friend class StateMachinePrivate;
 
     QTimer *autoDismissTimer();
 
     int m_priority = 0;
     QPointer<HmiLayeredState> m_layer;
+    // The region the popup opens in while its layer is active (the global region for a global
+    // popup), and the place it is open in (null while closed). See popupregions.cpp.
+    QPointer<QState> m_home;
+    PopupHolder *m_holder = nullptr;
     QVariant m_data;
     bool m_autoDismiss = false;
     int m_autoDismissInterval = 0;

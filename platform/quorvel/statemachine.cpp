@@ -11,6 +11,8 @@
 
 #include <QLoggingCategory>
 
+#include <algorithm>
+
 // The machine's core: its root hierarchy, posting, names and the public interface. The inner
 // workings live by concern in fanout.cpp (notifications), adoption.cpp (the turn of each fired
 // transition), popupregions.cpp (popups) and backstack.cpp (views and back navigation).
@@ -65,6 +67,8 @@ void StateMachinePrivate::build()
     router = new ArmedTransition(QStringLiteral("FrameworkRoute"), q);
     adoptedHolder = new QState(q);
     adoptedHolder->setObjectName(QStringLiteral("AdoptedTransitions"));
+    popupParking = new QState(q);
+    popupParking->setObjectName(QStringLiteral("ClosedPopups"));
 }
 
 bool StateMachinePrivate::isActive(const QAbstractState *state) const
@@ -198,8 +202,8 @@ void StateMachine::installRootHierarchy(const RootHierarchyTransitions &transiti
 {
     for (const auto &entry : popups) {
         PopupState *popup = entry.second;
-        if (popup && !popup->parentState())
-            d->placeInRegion(popup, d->popups);
+        if (popup && !popup->parent())
+            d->setHomeRegion(popup, d->popups);
     }
     for (const auto &entry : transitions) {
         QAbstractTransition *transition = entry.second;
@@ -254,13 +258,44 @@ QStringList StateMachine::openPopups() const
 QStringList StateMachine::popupStack(const QString &viewId) const
 {
     QStringList ids;
-    if (PopupRegion *region = StateMachinePrivate::regionOf(d->popupFor(viewId))) {
+    if (PopupRegion *region = d->regionOf(d->popupFor(viewId))) {
         for (const QPointer<PopupState> &each : qAsConst(region->stack)) {
             if (each)
                 ids.append(each->viewId());
         }
     }
     return ids;
+}
+
+void StateMachine::popupAnswered(const QString &viewId)
+{
+    if (!isRunning() || !d->popupsById.contains(viewId)) {
+        qCWarning(quorvelLog).noquote() << "popupAnswered: no popup" << viewId << "to answer";
+        return;
+    }
+    QStateMachine::postEvent(new PopupAnsweredEvent(viewId));
+}
+
+QList<QState *> StateMachine::popupRegions() const
+{
+    QList<QState *> regions;
+    for (PopupRegion *region : qAsConst(d->regions))
+        regions.append(region);
+    return regions;
+}
+
+QList<PopupState *> StateMachine::regionPopups(const QState *region) const
+{
+    QList<PopupState *> popups;
+    for (const QVector<PopupState *> &popupsOfView : qAsConst(d->popupsById)) {
+        for (PopupState *popup : popupsOfView) {
+            if (popup->m_home == region)
+                popups.append(popup);
+        }
+    }
+    std::sort(popups.begin(), popups.end(),
+              [](const PopupState *a, const PopupState *b) { return a->viewId() < b->viewId(); });
+    return popups;
 }
 
 void StateMachine::goToState(QAbstractState *target)

@@ -28,9 +28,10 @@ class StateMachinePrivate;
 //                                                     "ScreensIdle")
 //                                                     '- "Popups"   the global popup region
 //
-// A popup region (the global one, and the layer of each layered state) is parallel: each popup
-// sits in a slot of its own ("<id>Slot", closed in "<id>Closed"), so every popup that is open is
-// an active state, on top or covered (see PopupState for when a popup opens and closes).
+// A popup region (the global one, and the layer of each layered state) holds the popups open in
+// it, on top or covered, each an active state; a closed popup is no state of the running
+// configuration, so what a region costs follows the popups open, not those declared (see
+// PopupState for when a popup opens and closes, popupregions.cpp for how).
 //
 // Host side, in this order:
 //   1. add screens under screensState() (and setInitialHmiState() on it), hand it to modules;
@@ -83,7 +84,8 @@ public:
     void postEvent(QEvent *event, EventPriority priority = NormalPriority);
 
     // Popups, by view identifier (the view controller's requests end here).
-    // Returns false when no popup state carries the identifier (nothing is entered then).
+    // Returns false when no popup state carries the identifier (nothing is entered then). A
+    // request that cannot be honoured is journaled as "popup-dropped" {id, reason} and warned.
     // Requests and dismissals made while the transitions of one notification run take effect
     // after all of them have run, in the order made.
     bool requestPopup(const QString &viewId, const QVariant &data = QVariant());
@@ -95,6 +97,14 @@ public:
     QStringList openPopups() const;
     // The popups requested and not dismissed in the region of `viewId`'s popup, bottom first.
     QStringList popupStack(const QString &viewId) const;
+    // The driver answered the popup (a view's button made its controller call). Once the events
+    // posted so far have been handled, the popup closes if it is still open and the module
+    // leaves its closing to the framework: it has no transition of its own.
+    void popupAnswered(const QString &viewId);
+    // The popup regions, in creation order (the global one first), and the popups that open in
+    // one while its layer is active (for tools that draw the chart).
+    QList<QState *> popupRegions() const;
+    QList<PopupState *> regionPopups(const QState *region) const;
 
     // Moves to `target` as an adopted transition would: leaves the active states below the
     // deepest active proper ancestor of `target`, then enters it. Asynchronous.

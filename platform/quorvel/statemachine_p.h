@@ -96,12 +96,28 @@ private:
     static const QEvent::Type s_type;
 };
 
+// The driver answered a popup: posted behind the events its answer posted, it closes the popup
+// then if the module leaves its closing to the framework and it is still open.
+class PopupAnsweredEvent : public QEvent
+{
+public:
+    explicit PopupAnsweredEvent(const QString &viewId);
+    static QEvent::Type eventType() { return s_type; }
+
+    QString viewId;
+
+private:
+    static const QEvent::Type s_type;
+};
+
 // A framework transition that the machine takes for one event only: the event it is armed with.
 class ArmedTransition : public QAbstractTransition
 {
 public:
     ArmedTransition(const QString &name, QState *source);
     void arm(QEvent *event, QAbstractState *target);
+    // One more target for the event it is armed with (a slot opening several popups at once).
+    void addTarget(QAbstractState *target);
     void disarm() { m_armed = nullptr; }
     bool isArmed() const { return m_armed; }
 
@@ -113,36 +129,62 @@ private:
     QEvent *m_armed = nullptr;
 };
 
-// A popup region: a parallel state with one slot per popup, so that every open popup is an active
-// state whether it is on top or covered. The stack orders the open popups by priority; its top
-// is the one shown.
-class PopupRegion : public QState
+class PopupRegion;
+
+// The place of one open popup in its region: the popup, or nothing (its empty state).
+class PopupHolder : public QState
+{
+public:
+    PopupHolder(PopupRegion *region, QState *link, int index);
+    PopupRegion *region() const { return m_region; }
+    QState *emptyState() const { return m_empty; }
+    ArmedTransition *mover() const { return m_mover; }
+
+    // The popup put here: open, or opening in the step under way.
+    QPointer<PopupState> occupant;
+
+private:
+    PopupRegion *m_region;
+    QState *m_empty;
+    ArmedTransition *m_mover;
+};
+
+// One step of a region's chain: vacant, or a link (a parallel pair of a holder and the next
+// slot). Its mover opens popups in the holders below it, or closes every link below it.
+class PopupSlot : public QState
+{
+public:
+    PopupSlot(const QString &name, QState *parent);
+    QState *vacantState() const { return m_vacant; }
+    ArmedTransition *mover() const { return m_mover; }
+
+    QState *link = nullptr; // made when the chain first grows this deep
+
+private:
+    QState *m_vacant;
+    ArmedTransition *m_mover;
+};
+
+// A popup region: the global one, or the layer of a layered state. See popupregions.cpp for how
+// its chain of places holds the open popups. The stack orders the open popups by priority; its
+// top is the one shown.
+class PopupRegion : public PopupSlot
 {
 public:
     PopupRegion(const QString &name, QState *parent);
 
+    // Grows the chain by one link: a holder and the slot after it.
+    void extend();
+
+    // The chain: slotChain[0] is the region itself; holders[i] and slotChain[i + 1] form the link
+    // below slotChain[i]. Links are made as the chain first grows and kept for later.
+    QVector<PopupSlot *> slotChain;
+    QVector<PopupHolder *> holders;
     // The popups open or about to open (requested and not dismissed), bottom first.
     QList<QPointer<PopupState>> stack;
     // The popup last reported on top ("popup-shown"), until it is reported hidden.
     QPointer<PopupState> shown;
     bool syncPending = false;
-};
-
-// One popup's place in its region: closed, or the popup open. The framework opens and closes the
-// popup with the slot's own armed transition, which leaves nothing outside the slot.
-class PopupSlot : public QState
-{
-public:
-    PopupSlot(PopupState *popup, PopupRegion *region);
-    PopupState *popup() const; // null once the popup is deleted
-    PopupRegion *region() const { return static_cast<PopupRegion *>(parentState()); }
-    QState *closedState() const { return m_closed; }
-    ArmedTransition *mover() const { return m_mover; }
-
-private:
-    QPointer<PopupState> m_popup;
-    QState *m_closed;
-    ArmedTransition *m_mover;
 };
 
 // Forwards each emission of one signal of one sender to the dispatcher, with its arguments.
@@ -214,9 +256,18 @@ public:
 
     // Popups (popupregions.cpp).
     PopupRegion *createPopupRegion(const QString &name, QState *parent);
-    void placeInRegion(PopupState *popup, PopupRegion *region);
-    static PopupSlot *slotOf(const PopupState *popup);
-    static PopupRegion *regionOf(const PopupState *popup);
+    void setHomeRegion(PopupState *popup, PopupRegion *region);
+    // The region a popup is open in, or else the one it would open in now.
+    PopupRegion *regionOf(const PopupState *popup) const;
+    int activeLinks(const PopupRegion *region) const;
+    QState *placePopup(PopupState *popup, PopupRegion *region, QEvent *event);
+    void closeInStep(PopupState *popup, QEvent *event);
+    void arm(ArmedTransition *mover, QEvent *event, QAbstractState *target);
+    void settlePopups();
+    void regionExited(PopupRegion *region);
+    bool leavesClosingToFramework(const PopupState *popup) const;
+    void closeAnsweredPopup(const QString &viewId);
+    void checkPopupInvariants() const;
     void registerPopup(PopupState *popup);
     void forgetPopup(PopupState *popup);
     PopupState *popupFor(const QString &viewId) const;
@@ -259,7 +310,11 @@ public:
     QHash<QString, QVector<PopupState *>> popupsById;
     QVector<PopupRegion *> regions; // creation order
     QVector<PopupRegion *> topsToReport; // regions whose top may have changed, in that order
-    QVector<PopupSlot *> armedSlots;
+    // The movers armed for the step under way, and the popups placed or left in it.
+    QVector<ArmedTransition *> armedMovers;
+    QVector<QPointer<PopupState>> unsettled;
+    // Closed popups wait on this never-active state: they cost nothing while closed.
+    QState *popupParking = nullptr;
 
     quint64 m_batch = 0;
     quint64 currentBatch = 0;
