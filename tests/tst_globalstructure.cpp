@@ -229,6 +229,8 @@ private slots:
     void popupList();
     void transitionList();
     void guardsFindTheirTransitions();
+    void activeStatesFollowOpenPopups_data();
+    void activeStatesFollowOpenPopups();
 };
 
 void TestGlobalStructure::popupList()
@@ -289,6 +291,36 @@ void TestGlobalStructure::guardsFindTheirTransitions()
             missing.append(guard.name());
     }
     QCOMPARE(missing, QList<QByteArray>());
+}
+
+// What the running machine costs follows the popups open, not those declared: with none open the
+// whole HMI runs on a handful of active states, and each popup opened adds a few.
+void TestGlobalStructure::activeStatesFollowOpenPopups_data()
+{
+    QTest::addColumn<int>("requested");
+    for (int requested : {0, 1, 3})
+        QTest::addRow("%d open", requested) << requested;
+    QTest::addRow("all open") << -1;
+}
+
+void TestGlobalStructure::activeStatesFollowOpenPopups()
+{
+    QFETCH(int, requested);
+    m_hmi->start();
+    TestSupport::processUntilIdle();
+    auto *machine = Quorvel::StateMachine::instance();
+    const int idle = machine->configuration().size();
+    QVERIFY2(idle <= 20, qPrintable(QString::number(idle)));
+    const auto popups = m_hmi->host().integration()->moduleRootHierarchyPopupStates();
+    for (int i = 0; i < (requested < 0 ? popups.size() : requested); ++i)
+        machine->requestPopup(popups.at(i).second->viewId());
+    TestSupport::processUntilIdle();
+    // Opening one of the text-message alerts closes the other two.
+    const int open = machine->openPopups().size();
+    QVERIFY(open >= (requested < 0 ? popups.size() - 2 : requested));
+    const int added = machine->configuration().size() - idle;
+    QVERIFY2(added <= 5 * open,
+             qPrintable(QStringLiteral("%1 open, %2 added").arg(open).arg(added)));
 }
 
 QTEST_GUILESS_MAIN(TestGlobalStructure)

@@ -82,6 +82,8 @@ void SimulatorTest::scenarioFile_data()
             {"unknown slot", "{\"call\": \"answer\"}", ":2: the controller has no slot answer"},
             {"slot with too many arguments", "{\"call\": \"endCall\", \"args\": [1]}",
              ":2: slot endCall takes no 1 argument(s)"},
+            {"answer by an unknown slot", "{\"answer\": \"PHONE.BatteryLow\", \"call\": \"ok\"}",
+             ":2: the controller has no slot ok"},
             {"unknown model", "{\"model\": \"phone.recentCalls\", \"length\": 3}",
              ":2: unknown list model phone.recentCalls"},
             {"row that is no object", "{\"model\": \"phone.phoneBook\", \"rows\": [1]}",
@@ -110,6 +112,9 @@ void SimulatorTest::scenarioFile_data()
             << QByteArray("{\"call\": \"deleteLater\"}\n{\"intent\": 1, \"args\": [\"0123\"]}\n"
                           "{\"call\": \"endCall\"}\n")
             << 1 << QStringLiteral(": 1 step could not be applied (line 3)");
+    QTest::newRow("an answer to a popup that is not open")
+            << QByteArray("{\"answer\": \"PHONE.RoamingWarning\"}\n") << 1
+            << QStringLiteral(": 1 step could not be applied (line 1)");
     QTest::newRow("a year at a time, twice")
             << QByteArray("{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
                           "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")

@@ -44,6 +44,11 @@ void ViewController::dismissPopup(const QString &viewId)
     Quorvel::StateMachine::instance()->dismissPopup(viewId);
 }
 
+void ViewController::popupAnswered(const QString &viewId)
+{
+    Quorvel::StateMachine::instance()->popupAnswered(viewId);
+}
+
 void ViewController::showView(const QVariant &viewId, const QVariant &data, bool flag,
                               const QVariant &extra)
 {

@@ -17,11 +17,15 @@ class ViewController : public QObject
 public:
     static ViewController *instance();
 
-    // Shows the popup state of that name when one is installed and its layer is active; a
-    // request for an identifier that no popup state carries is only recorded.
+    // Opens the popup state of that name (in its layer while the layer is active, over the screen
+    // shown otherwise); a request that cannot be honoured is recorded as "popup-dropped".
     void requestPopup(const QString &viewId, const QVariant &data = QVariant());
     // Closes the popup, on top or covered; the next one still open shows.
     void dismissPopup(const QString &viewId);
+    // The driver answered the popup with one of its buttons, after the button's controller call:
+    // once the events posted so far have been handled, a popup whose closing the module leaves
+    // to the framework (it has no transition of its own) closes if it is still open.
+    void popupAnswered(const QString &viewId);
     // Enters the view state showing that view; for an identifier that no view state shows, the
     // state of that name (entered through its initial state). Anything else is only recorded.
     void showView(const QVariant &viewId, const QVariant &data = QVariant(), bool flag = false,

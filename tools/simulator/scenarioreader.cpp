@@ -124,9 +124,12 @@ QString checkEmit(const ScenarioStep &step)
 
 QString checkCall(const ScenarioStep &step, const QObject *controller)
 {
-    if (!controller)
+    if (!controller
+        || (step.kind == ScenarioStep::Answer && !step.object.contains(QLatin1String("call"))))
         return QString();
-    const QByteArray name = step.name().toLatin1();
+    const QByteArray name
+            = (step.kind == ScenarioStep::Answer ? step.value("call").toString() : step.name())
+                      .toLatin1();
     const int count = step.value("args").toArray().size();
     const QMetaObject *meta = controller->metaObject();
     bool named = false;
@@ -185,6 +188,7 @@ QString ScenarioReader::check(const ScenarioStep &step, const QObject *controlle
     case ScenarioStep::Emit:
         return checkEmit(step);
     case ScenarioStep::Call:
+    case ScenarioStep::Answer:
         return checkCall(step, controller);
     case ScenarioStep::Model:
         return checkModel(step);

@@ -243,6 +243,8 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
         invokeByName(target, step.name(), args, QMetaMethod::Slot, &error);
         return error;
     }
+    case ScenarioStep::Answer:
+        return answer(step, args);
     case ScenarioStep::Intent: {
         const int action = step.value("intent").toInt();
         m_output->skipNextJournalEntry(QStringLiteral("intent"));
@@ -292,6 +294,39 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
     default:
         return QString();
     }
+}
+
+// The driver taps a button of an open popup (on top or covered): the answer is traced, the
+// button's controller call made, and once its events have been handled the framework closes the
+// popup if the module leaves that to it.
+QString ScenarioRunner::answer(const ScenarioStep &step, const QVariantList &args)
+{
+    const QString wanted = step.name();
+    QString id;
+    for (const QString &open : Brisken::ViewController::instance()->openPopups()) {
+        if (open == wanted || open.endsWith(QLatin1Char('.') + wanted))
+            id = open;
+    }
+    if (id.isEmpty())
+        return QStringLiteral("popup %1 is not open: nobody can answer it").arg(wanted);
+    QVariantMap fields{{QStringLiteral("id"), id}};
+    const QString call = step.value("call").toString();
+    if (!call.isEmpty()) {
+        fields.insert(QStringLiteral("call"), call);
+        fields.insert(QStringLiteral("args"), args);
+    }
+    m_output->write(QStringLiteral("answer"), fields);
+    if (!call.isEmpty()) {
+        QObject *target = controller();
+        if (!target)
+            return QStringLiteral("the module exports no %1").arg(ControllerProperty);
+        QString error;
+        invokeByName(target, call, args, QMetaMethod::Slot, &error);
+        if (!error.isEmpty())
+            return error;
+    }
+    Brisken::ViewController::instance()->popupAnswered(id);
+    return QString();
 }
 
 QString ScenarioRunner::chooseSettingsEntry(const QString &entry)

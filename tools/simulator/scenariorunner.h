@@ -74,6 +74,7 @@ private:
     // {"open": "settings/<entry>"}: the settings menu's entry, chosen as the driver would; empty
     // or why it could not be.
     QString chooseSettingsEntry(const QString &entry);
+    QString answer(const ScenarioStep &step, const QVariantList &args);
 
     Host::ModuleHost *m_host;
     QQmlEngine *m_engine;

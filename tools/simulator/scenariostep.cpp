@@ -17,7 +17,7 @@ struct StepName
     const char *key;
     ScenarioStep::Kind kind;
     // The other fields a step of this kind may have.
-    const char *fields[2];
+    const char *fields[3];
 };
 
 // The key that names each kind of step; every step has exactly one of them.
@@ -26,6 +26,7 @@ const StepName StepNames[] = {
         {"emit", ScenarioStep::Emit, {"args"}},
         {"key", ScenarioStep::Key, {"kind"}},
         {"call", ScenarioStep::Call, {"args"}},
+        {"answer", ScenarioStep::Answer, {"call", "args"}},
         {"intent", ScenarioStep::Intent, {"args"}},
         {"post", ScenarioStep::Post, {"value"}},
         {"open", ScenarioStep::Open, {}},
@@ -72,6 +73,12 @@ QString checkFields(const ScenarioStep &step, const char *key)
     case ScenarioStep::Call:
     case ScenarioStep::Post:
         return checkString(o.value(QLatin1String(key)), key);
+    case ScenarioStep::Answer: {
+        const QString error = checkString(o.value(QLatin1String(key)), key);
+        if (!error.isEmpty() || !has("call"))
+            return error;
+        return checkString(o.value(QLatin1String("call")), "call");
+    }
     case ScenarioStep::Key: {
         if (!has("kind"))
             return QStringLiteral("\"key\" needs a \"kind\"");
@@ -182,16 +189,27 @@ ScenarioStep ScenarioStep::parse(const QByteArray &line, int lineNumber)
     }
     step.object = document.object();
 
+    // A step's own fields may carry another step's name ("answer" has a "call").
+    const auto isFieldOf = [](const StepName *step, const char *key) {
+        for (const char *field : step->fields) {
+            if (field && qstrcmp(field, key) == 0)
+                return true;
+        }
+        return false;
+    };
     const StepName *found = nullptr;
     for (const StepName &name : StepNames) {
         if (!step.object.contains(QLatin1String(name.key)))
             continue;
-        if (found) {
+        if (!found) {
+            found = &name;
+        } else if (isFieldOf(&name, found->key)) {
+            found = &name;
+        } else if (!isFieldOf(found, name.key)) {
             step.error = QStringLiteral("a step names one thing to do, not \"%1\" and \"%2\"")
                                  .arg(QLatin1String(found->key), QLatin1String(name.key));
             return step;
         }
-        found = &name;
     }
     if (!found) {
         step.error = QStringLiteral("unknown step");

@@ -17,6 +17,9 @@ struct ScenarioStep
         Emit, // {"emit": "phone.missedCallsPresent", "args": []}
         Key, // {"key": 12, "kind": 2}
         Call, // {"call": "acceptIncomingCall", "args": []}
+        // The driver answers an open popup with its button: the button's controller call, if
+        // any, then the framework closes the popup if the module leaves that to it.
+        Answer, // {"answer": "PHONE.RoamingWarning", "call": "confirmRoamingCall", "args": []}
         Intent, // {"intent": 1, "args": ["0123456789"]}
         Post, // {"post": "HmiPhone_RootStateRequest", "value": null}
         Open, // {"open": "phone"}, "home", "settings" or "settings/Phone" (a settings entry)

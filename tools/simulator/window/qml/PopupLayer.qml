@@ -18,7 +18,11 @@ Item {
         model: popupLayer.popups
         Rectangle {
             id: card
-            readonly property var popupActions: Views.actionsFor(modelData.name)
+            // A popup without buttons of its own gets a plain close button.
+            readonly property var popupActions: {
+                var actions = Views.actionsFor(modelData.name);
+                return actions.length > 0 ? actions : [["OK"]];
+            }
             readonly property int stackDepth: popupLayer.popups.length - 1 - index
             objectName: "popup:" + modelData.name
             property string viewId: modelData.id
@@ -66,10 +70,13 @@ Item {
                     Button {
                         width: Math.min(implicitWidth, (card.width - 48) / card.popupActions.length - 16)
                         text: modelData[0]
-                        slot: modelData[1]
-                        tint: modelData[1].indexOf("accept") === 0 ? Theme.accept
-                              : modelData[1].indexOf("reject") === 0 ? Theme.reject : Theme.raised
-                        onClicked: Views.invoke(popupLayer.controller, modelData)
+                        slot: modelData[1] || "close"
+                        tint: slot.indexOf("accept") === 0 ? Theme.accept
+                              : slot.indexOf("reject") === 0 ? Theme.reject : Theme.raised
+                        // The driver's answer, played as a step so that the trace shows it; after
+                        // this handler, since the answer may close the popup and this button.
+                        onClicked: Qt.callLater(_scenario.input,
+                                                JSON.stringify(Views.answer(card.viewId, modelData)))
                     }
                 }
             }

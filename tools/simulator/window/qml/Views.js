@@ -70,8 +70,12 @@ var actions = [
     [/^PhoneSmsDownloading$/, [["Cancel", "cancelMessagesDownloading"]]],
     [/^PhoneSmsAccessNotGranted$/, [["Retry", "requestMessageProfileAccessRetry"]]],
     [/^PhoneDeleteAllContactsPopup$/, [["Delete", "requestDeleteAllContacts"]]],
-    [/^PhoneStatusAlertPopup(\d+)$/, function (m) { var id = parseInt(m[1]);
-        return [["Fix", "fixStatusAlert", id], ["Clear", "clearStatusAlert", id]]; }],
+    // Popups 50 to 59 offer to clear alerts 1001 to 1010, popups 60 to 69 to fix them; the
+    // buttons name the alert, not the popup.
+    [/^PhoneStatusAlertPopup(5\d)$/, function (m) { var alert = 1001 + parseInt(m[1]) % 10;
+        return [["Clear", "clearAlertPermanently", alert], ["This drive", "clearAlertForThisCycle", alert]]; }],
+    [/^PhoneStatusAlertPopup(6\d)$/, function (m) { var alert = 1001 + parseInt(m[1]) % 10;
+        return [["Fix", "fixStatusAlert", alert]]; }],
     [/^PhoneStatusAlerts$/, [["Alerts", "viewStatusBarAlerts"]]],
     [/^PhoneBookAutoDownload$/, [["Yes", "autoDownloadPhoneBookPositive"], ["No", "autoDownloadPhoneBookNegative"]]],
     [/^PhoneBook(DownloadFailed|DownloadFailedAgain)$/, [["Retry", "retryAutomaticContactDownload"]]],
@@ -93,6 +97,17 @@ function actionsFor(name) {
             return typeof actions[i][1] === "function" ? actions[i][1](match) : actions[i][1];
     }
     return [];
+}
+
+// The step of the driver's answer to a popup with a button's row: the popup, the controller
+// call the button makes (none for a plain close button) and its arguments.
+function answer(viewId, action) {
+    var step = { "answer": viewId };
+    if (action.length > 1) {
+        step.call = action[1];
+        step.args = action.slice(2);
+    }
+    return step;
 }
 
 // Calls the controller's slot as a view does: by name, with the row's arguments.
