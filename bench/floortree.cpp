@@ -3,6 +3,7 @@
 #include <quorvel/guardedtransition.h>
 #include <quorvel/hmisignaltransition.h>
 #include <quorvel/hmistate.h>
+#include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 
 #include <QCoreApplication>
@@ -28,26 +29,53 @@ protected:
     void onTransition(QEvent *) override { }
 };
 
-void captureState(QState *state, int parentIndex, TreeShape &shape,
-                  QHash<const QAbstractState *, int> &indexes,
-                  QVector<QPair<QAbstractTransition *, int>> &transitions)
+struct Capture
 {
-    const int index = shape.nodes.size();
+    TreeShape &shape;
+    QHash<const QAbstractState *, int> &indexes;
+    QVector<QPair<QAbstractTransition *, int>> &transitions;
+    Quorvel::StateMachine *hmiMachine;
+    QList<QState *> regions;
+};
+
+int addNode(Capture &c, const QAbstractState *state, int parentIndex, bool parallel,
+            const QString &name)
+{
+    const int index = c.shape.nodes.size();
     TreeShape::Node node;
     node.parent = parentIndex;
-    node.parallel = state && state->childMode() == QState::ParallelStates;
-    node.name = state ? state->objectName() : QString();
-    shape.nodes.append(node);
-    indexes.insert(state, index);
+    node.parallel = parallel;
+    node.name = name;
+    c.shape.nodes.append(node);
+    if (state)
+        c.indexes.insert(state, index);
+    return index;
+}
+
+void captureState(Capture &c, QAbstractState *abstract, int parentIndex)
+{
+    auto *state = qobject_cast<QState *>(abstract);
+    const int index = addNode(c, abstract, parentIndex,
+                              state && state->childMode() == QState::ParallelStates,
+                              abstract->objectName());
     if (!state)
         return;
+    // A popup region as it would be written by hand: an exclusive state with nothing shown
+    // first and the region's popups beside it, one of them open at a time. None of the
+    // framework's own places for popups is copied.
+    if (c.regions.contains(state)) {
+        const int none
+                = addNode(c, nullptr, index, false, state->objectName() + QStringLiteral("None"));
+        c.shape.nodes[index].initial = none;
+        for (Quorvel::PopupState *popup : c.hmiMachine->regionPopups(state))
+            captureState(c, popup, index);
+        return;
+    }
     for (QObject *child : state->children()) {
         if (auto *transition = qobject_cast<QAbstractTransition *>(child))
-            transitions.append({transition, index});
-        else if (auto *childState = qobject_cast<QState *>(child))
-            captureState(childState, index, shape, indexes, transitions);
-        else if (qobject_cast<QAbstractState *>(child))
-            captureState(nullptr, index, shape, indexes, transitions);
+            c.transitions.append({transition, index});
+        else if (auto *childState = qobject_cast<QAbstractState *>(child))
+            captureState(c, childState, index);
     }
 }
 
@@ -58,12 +86,35 @@ TreeShape TreeShape::capture(QStateMachine *machine)
     TreeShape shape;
     QHash<const QAbstractState *, int> indexes;
     QVector<QPair<QAbstractTransition *, int>> transitions;
-    captureState(machine, -1, shape, indexes, transitions);
+    auto *hmiMachine = qobject_cast<Quorvel::StateMachine *>(machine);
+    Capture c{shape, indexes, transitions, hmiMachine,
+              hmiMachine ? hmiMachine->popupRegions() : QList<QState *>()};
+    addNode(c, machine, -1, false, machine->objectName());
+    // The machine's states other than its initial one hold the framework's waiting transitions
+    // and closed popups: a hand-written machine has neither.
+    for (QObject *child : machine->children()) {
+        if (auto *transition = qobject_cast<QAbstractTransition *>(child))
+            transitions.append({transition, 0});
+        else if (!qobject_cast<QAbstractState *>(child))
+            continue;
+        else if (child == machine->initialState() || !hmiMachine)
+            captureState(c, static_cast<QAbstractState *>(child), 0);
+        else
+            for (QObject *waiting : child->children()) {
+                if (auto *transition = qobject_cast<QAbstractTransition *>(waiting))
+                    transitions.append({transition, 0});
+            }
+    }
     for (auto it = indexes.constBegin(); it != indexes.constEnd(); ++it) {
         if (auto *state = qobject_cast<const QState *>(it.key()))
             shape.nodes[it.value()].initial = indexes.value(state->initialState(), -1);
     }
-    auto *hmiMachine = qobject_cast<Quorvel::StateMachine *>(machine);
+    // Regions keep the "nothing shown" state they were given.
+    for (QState *region : qAsConst(c.regions)) {
+        const int index = indexes.value(region, -1);
+        if (index >= 0)
+            shape.nodes[index].initial = index + 1;
+    }
     for (const auto &entry : qAsConst(transitions)) {
         QAbstractTransition *transition = entry.first;
         Transition shaped;

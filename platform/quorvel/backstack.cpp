@@ -103,7 +103,8 @@ void StateMachinePrivate::goToState(QAbstractState *target, QEvent::Type type)
 {
     if (!target || !q->isRunning())
         return;
-    q->QStateMachine::postEvent(new RouteEvent(target, type), QStateMachine::HighPriority);
+    // A route keeps an event of its own: the states it enters tell back navigation by its type.
+    postInternal(new RouteEvent(target, type));
 }
 
 // The router is armed for the route's event on the target's domain: it leaves only what lies

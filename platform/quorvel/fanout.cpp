@@ -29,6 +29,11 @@ const QEvent::Type FireEvent::s_type = registeredType();
 const QEvent::Type RouteEvent::s_type = registeredType();
 const QEvent::Type PopupSyncEvent::s_type = registeredType();
 const QEvent::Type PopupAnsweredEvent::s_type = registeredType();
+const QEvent::Type WakeEvent::s_type = registeredType();
+
+WakeEvent::WakeEvent()
+    : QEvent(eventType())
+{ }
 
 FireEvent::FireEvent(const FireTurn &turn, quint64 batch, bool last)
     : QEvent(eventType())
@@ -211,8 +216,61 @@ void StateMachinePrivate::notify(const QVector<HmiAbstractTransition *> &listene
         posted = 1;
     }
     for (int i = posted; i < turns.size(); ++i)
-        q->QStateMachine::postEvent(new FireEvent(turns.at(i), batch, i == turns.size() - 1),
-                                    QStateMachine::HighPriority);
+        queueWork({turns.at(i), batch, i == turns.size() - 1, nullptr});
+}
+
+void StateMachinePrivate::queueWork(const PendingWork &work)
+{
+    if (queuedInQt > 0) {
+        // Behind what already waits in Qt's queue.
+        if (work.sync)
+            postInternal(new PopupSyncEvent(work.sync));
+        else
+            postInternal(new FireEvent(work.turn, work.batch, work.last));
+        return;
+    }
+    pending.append(work);
+    if (!inLoop && !wakePending) {
+        wakePending = true;
+        q->QStateMachine::postEvent(new WakeEvent, QStateMachine::HighPriority);
+    }
+}
+
+void StateMachinePrivate::postInternal(QEvent *event)
+{
+    if (!q->isRunning()) {
+        delete event;
+        return;
+    }
+    ++queuedInQt;
+    q->QStateMachine::postEvent(event, QStateMachine::HighPriority);
+}
+
+// Takes the first pending work that makes the machine step for `event`; work that no longer has
+// anything to do (its transitions' sources left, its region already in line) is passed over.
+// Returns whether the machine steps.
+bool StateMachinePrivate::takePending(QEvent *event)
+{
+    while (!pending.isEmpty()) {
+        const PendingWork work = pending.takeFirst();
+        if (work.sync || !work.batch) {
+            if (work.sync) {
+                currentBatch = 0;
+                syncRegion(work.sync, event);
+                if (!armedMovers.isEmpty())
+                    return true;
+            }
+            continue;
+        }
+        currentBatch = work.batch;
+        lastTurn = work.last;
+        turnSteps = takeTurn(work.turn, event);
+        if (turnSteps)
+            return true;
+        if (lastTurn)
+            finishBatch();
+    }
+    return false;
 }
 
 // Arms the turn's transitions for `event`: a targeted one itself (placed for its turn), a run of
@@ -273,40 +331,52 @@ void StateMachinePrivate::finishBatch()
 //    inactive, so that property transitions can follow values), then whether its source is
 //    active (adopted transitions always are), then its guard. It splits the enabled ones, in
 //    that order, into turns (a targeted transition alone, a run of targetless ones together)
-//    and posts one FireEvent per turn; an HmiEvent takes its first turn itself. All framework
-//    events are posted at high priority: they run before any module event still waiting, in
-//    posting order.
-// 2. A FireEvent is one turn (takeTurn): Qt takes the turn's transition for that event only, if
-//    its source is still active (otherwise it is dropped; placeForTurn moves a targeted one
-//    where it must fire from). Popup requests and dismissals made while it runs are kept for the
-//    batch.
-// 3. When the last turn is over, the batch's popup requests and dismissals apply in the order
-//    made (finishBatch); each changes a region's stack and asks for that region's
-//    PopupSyncEvent.
-// 4. A PopupSyncEvent opens and closes the region's popups as its stack says, all in one step
+//    and queues them as pending work; an HmiEvent takes its first turn itself.
+// 2. Pending work runs before anything else waiting, in the order queued: Qt's loop asks for
+//    eventless transitions before it takes any event, and that selection takes the next piece
+//    of work (takePending), so a turn costs the machine one selection, not two. Work queued
+//    while the machine is not running its loop posts a WakeEvent, which takes what is left.
+//    Work queued while a framework event (a route) still waits in Qt's queue is posted after
+//    it instead (a FireEvent or a PopupSyncEvent), so the order stays the order of queueing.
+// 3. A turn (takeTurn): Qt takes the turn's transition for that event only, if its source is
+//    still active (otherwise it is dropped; placeForTurn moves a targeted one where it must
+//    fire from). Popup requests and dismissals made while it runs are kept for the batch.
+// 4. When the last turn is over, the batch's popup requests and dismissals apply in the order
+//    made (finishBatch); each changes a region's stack and queues that region's sync.
+// 5. A sync opens and closes the region's popups as its stack says, all in one step
 //    (syncRegion); which popup is on top is reported when the step ends, and the popups that
 //    closed are parked (settlePopups).
-// 5. A RouteEvent (or a back event) moves to a state through the router transition placed on
-//    the target's domain.
-// 6. A PopupAnsweredEvent, posted at normal priority when the driver answered a popup, closes
+// 6. A RouteEvent (or a back event) moves to a state through the router transition placed on
+//    the target's domain; it keeps an event of its own, whose type tells back navigation.
+// 7. A PopupAnsweredEvent, posted at normal priority when the driver answered a popup, closes
 //    the popup if the module leaves its closing to the framework and it is still open.
 // Popup requests and dismissals made while the machine enters or leaves states outside a batch
-// (entry and exit slots, steps 4 and 5) take effect when that step ends (endMicrostep).
+// (entry and exit slots, steps 5 and 6) take effect when that step ends (endMicrostep).
 void StateMachinePrivate::beginSelect(QEvent *event)
 {
     // A last turn that took no step (unexpected) still closes its batch.
     if (lastTurn)
         finishBatch();
     turnSteps = false;
+    inLoop = true;
     const QEvent::Type type = event->type();
-    if (type == QEvent::None)
+    if (type == QEvent::None) {
+        if (!pending.isEmpty())
+            takePending(event);
         return;
+    }
     // Whatever was armed or moved for the previous event was taken by its step and put back.
     Q_ASSERT(!router->isArmed());
     Q_ASSERT(armedMovers.isEmpty());
     Q_ASSERT(!armedTransition);
 
+    if (type == WakeEvent::eventType()) {
+        wakePending = false;
+        takePending(event);
+        return;
+    }
     if (type == FireEvent::eventType()) {
+        --queuedInQt;
         auto *fire = static_cast<FireEvent *>(event);
         currentBatch = fire->batch;
         lastTurn = fire->last;
@@ -320,12 +390,14 @@ void StateMachinePrivate::beginSelect(QEvent *event)
         notify(eventListeners.value(hmiEvent->name()), QVariantList{hmiEvent->value()}, event,
                event);
     } else if (type == PopupSyncEvent::eventType()) {
+        --queuedInQt;
         if (PopupRegion *region = static_cast<PopupSyncEvent *>(event)->region)
             syncRegion(region, event);
     } else if (type == PopupAnsweredEvent::eventType()) {
         closeAnsweredPopup(static_cast<PopupAnsweredEvent *>(event)->viewId);
     } else if (auto *routeEvent = dynamic_cast<RouteEvent *>(event)) {
         // Either type: a back event posted by someone else is no route.
+        --queuedInQt;
         route(event, routeEvent->target);
     }
 }
@@ -334,6 +406,14 @@ void StateMachinePrivate::beginSelect(QEvent *event)
 // selected.
 void StateMachinePrivate::endSelect()
 {
+    const bool steps
+            = armedTransition || fanOut->isArmed() || router->isArmed() || !armedMovers.isEmpty();
+    inLoop = steps;
+    // Work left waiting with no step to come: the machine must come back for it.
+    if (!steps && !pending.isEmpty() && !wakePending) {
+        wakePending = true;
+        q->QStateMachine::postEvent(new WakeEvent, QStateMachine::HighPriority);
+    }
     if (armedTransition) {
         armedTransition->m_armed = nullptr;
         armedTransition = nullptr;
@@ -346,6 +426,7 @@ void StateMachinePrivate::endSelect()
 void StateMachinePrivate::endMicrostep()
 {
     inMicrostep = false;
+    inLoop = true;
     parkMovedTransition();
     if (router->isArmed()) {
         router->disarm();
@@ -364,6 +445,7 @@ void StateMachinePrivate::endMicrostep()
     }
     if (lastTurn)
         finishBatch();
+    inLoop = false;
 }
 
 } // namespace Quorvel

@@ -36,7 +36,7 @@
 // state, which is never active: it is put in a holder when it opens and parked again after the
 // step in which it closed (never during a step).
 //
-// Requests and dismissals change a region's stack; a PopupSyncEvent then opens and closes the
+// Requests and dismissals change a region's stack; a sync of the region then opens and closes the
 // popups to match, all in one step.
 //
 // Where a popup opens: a layer's popup in its layered state's region while that state is active;
@@ -406,7 +406,7 @@ void StateMachinePrivate::scheduleSync(PopupRegion *region)
     if (!q->isRunning() || region->syncPending)
         return;
     region->syncPending = true;
-    q->QStateMachine::postEvent(new PopupSyncEvent(region), QStateMachine::HighPriority);
+    queueWork({FireTurn(), 0, false, region});
 }
 
 // Arms the movers that bring the region's open popups in line with its stack: popups open and

@@ -58,6 +58,7 @@ public:
     FanOutTransition(StateMachinePrivate *d, QState *source);
     void arm(QEvent *event, const FireTurn &turn);
     void disarm();
+    bool isArmed() const { return m_armed; }
 
 protected:
     bool eventTest(QEvent *event) override { return event == m_armed; }
@@ -67,6 +68,18 @@ private:
     StateMachinePrivate *d;
     QEvent *m_armed = nullptr;
     FireTurn m_turn;
+};
+
+// Wakes the machine for the framework's own work waiting in StateMachinePrivate::pending (see
+// fanout.cpp): what its eventless selections have not taken by then, it takes.
+class WakeEvent : public QEvent
+{
+public:
+    WakeEvent();
+    static QEvent::Type eventType() { return s_type; }
+
+private:
+    static const QEvent::Type s_type;
 };
 
 // Moves the machine to a state (navigation). A move made by back navigation has the type
@@ -232,6 +245,19 @@ public:
     bool takeTurn(const FireTurn &turn, QEvent *event);
     void fireTargetless(const FireTurn &turn);
     void finishBatch();
+    // The framework's own work, in order: turns of notifications and popup syncs wait in
+    // `pending` and are taken by the machine's eventless selections, one step each; behind an
+    // event of the framework's still in Qt's queue (a route), they are posted after it instead.
+    struct PendingWork
+    {
+        FireTurn turn;
+        quint64 batch = 0;
+        bool last = false;
+        QPointer<PopupRegion> sync;
+    };
+    void queueWork(const PendingWork &work);
+    bool takePending(QEvent *event);
+    void postInternal(QEvent *event);
     void beginSelect(QEvent *event);
     void endSelect();
     void endMicrostep();
@@ -315,6 +341,11 @@ public:
     QVector<QPointer<PopupState>> unsettled;
     // Closed popups wait on this never-active state: they cost nothing while closed.
     QState *popupParking = nullptr;
+
+    QList<PendingWork> pending;
+    int queuedInQt = 0; // the framework's events posted to Qt's queue and not yet taken
+    bool wakePending = false;
+    bool inLoop = false; // selecting or stepping: an eventless selection follows a step
 
     quint64 m_batch = 0;
     quint64 currentBatch = 0;
