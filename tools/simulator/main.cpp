@@ -10,7 +10,9 @@
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#ifdef HMIPHONE_WITH_WINDOW
 #include "window/headunitwindow.h"
+#endif
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -153,6 +155,7 @@ int main(int argc, char *argv[])
     } else {
         QCoreApplication::setEventDispatcher(clock);
     }
+#ifdef HMIPHONE_WITH_WINDOW
     std::unique_ptr<QCoreApplication> application(
             display == Display::None
                     ? new QCoreApplication(argc, argv)
@@ -160,6 +163,9 @@ int main(int argc, char *argv[])
                             argc, argv,
                             display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
                                                        : Simulator::HeadUnitWindow::OffScreen));
+#else
+    std::unique_ptr<QCoreApplication> application(new QCoreApplication(argc, argv));
+#endif
     QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
 
@@ -223,6 +229,13 @@ int main(int argc, char *argv[])
                        writeScenarioOption, invariantsOption});
     parser.process(app);
 
+#ifndef HMIPHONE_WITH_WINDOW
+    if (display != Display::None) {
+        printError(QStringLiteral("this hmiphone-sim was built without its window "
+                                  "(HMIPHONE_BUILD_WINDOW=OFF): no --window, no --screenshots"));
+        return CannotRun;
+    }
+#endif
     const bool interactive = parser.isSet(interactiveOption);
     const bool random = parser.isSet(randomOption);
     const QStringList positional = parser.positionalArguments();
@@ -323,6 +336,7 @@ int main(int argc, char *argv[])
         return runSoak(&runner, &host, seed, randomSteps, parser.value(writeScenarioOption));
 
     if (display != Display::None) {
+#ifdef HMIPHONE_WITH_WINDOW
         // Steps of the window's panels are checked as they come, like typed ones.
         auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
             const QString error = Simulator::ScenarioReader::check(step, runner.controller());
@@ -355,6 +369,7 @@ int main(int argc, char *argv[])
                                 .arg(pictures)
                                 .arg(parser.value(screenshotsOption)));
         }
+#endif
     } else {
         std::unique_ptr<Simulator::Invariants> invariants;
         if (parser.isSet(invariantsOption))
