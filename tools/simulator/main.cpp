@@ -308,7 +308,7 @@ int main(int argc, char *argv[])
 
     Simulator::SimulatedPhone *phone = nullptr;
     if (phoneMode == QLatin1String("simulated")) {
-        phone = new Simulator::SimulatedPhone(&app);
+        phone = new Simulator::SimulatedPhone(clock, &app);
         phone->connectPhone();
     }
 
