@@ -3,6 +3,8 @@
 
 #include "testsupport.h"
 
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QProcess>
 #include <QTemporaryDir>
 #include <QtTest>
@@ -20,9 +22,15 @@ private:
 
 void SimulatorTest::scenarioFile_data()
 {
-    QTest::addColumn<QByteArray>("scenario");
+    QTest::addColumn<QStringList>("options"); // before the scenario file, if there is one
+    QTest::addColumn<QByteArray>("scenario"); // empty: no file
+    QTest::addColumn<QByteArray>("input"); // standard input
     QTest::addColumn<int>("exitCode");
-    QTest::addColumn<QString>("message"); // a line of stderr contains it
+    QTest::addColumn<QString>("message"); // stdout or stderr contains it
+    const auto row = [](const char *tag, const QStringList &options, const QByteArray &scenario,
+                        const QByteArray &input, int exitCode, const QString &message) {
+        QTest::newRow(tag) << options << scenario << input << exitCode << message;
+    };
 
     // Refused before anything runs: exit 2, the line named. Line 1 of each scenario is a valid
     // step that would show a view if it ran.
@@ -80,6 +88,11 @@ void SimulatorTest::scenarioFile_data()
              "{\"emit\": \"key.keyEvent\", \"args\": [12, \"short\"]}",
              ":2: argument 2 of key.keyEvent: must be a whole number"},
             {"unknown slot", "{\"call\": \"answer\"}", ":2: the controller has no slot answer"},
+            {"slot hidden from QML", "{\"call\": \"deleteLater\"}",
+             ":2: QML cannot call deleteLater"},
+            {"unknown key", "{\"key\": 13, \"kind\": 2}", ":2: key 13 is none of the car's keys"},
+            {"unknown key kind", "{\"key\": 12, \"kind\": 5}",
+             ":2: kind 5 is no kind of key event"},
             {"slot with too many arguments", "{\"call\": \"endCall\", \"args\": [1]}",
              ":2: slot endCall takes no 1 argument(s)"},
             {"answer by an unknown slot", "{\"answer\": \"PHONE.BatteryLow\", \"call\": \"ok\"}",
@@ -94,56 +107,111 @@ void SimulatorTest::scenarioFile_data()
              ":2: phone has no property colour"},
             {"empty expectation", "{\"expect\": {}}", ":2: an expectation is a non-empty object"},
     };
-    for (const auto &row : refused)
-        QTest::newRow(row.tag) << (open + row.line + "\n") << 2 << QString::fromUtf8(row.message);
-    QTest::newRow("every bad line named")
-            << QByteArray("{\"back\": \"x\"}\n{\"open\": \"phone\"}\n{\"key\": 1.5, \"kind\": 1}\n")
-            << 2 << QStringLiteral("2 of 3 lines cannot run; nothing was run");
+    for (const auto &refusal : refused)
+        row(refusal.tag, {}, open + refusal.line + "\n", {}, 2, QString::fromUtf8(refusal.message));
+    row("every bad line named", {},
+        "{\"back\": \"x\"}\n{\"open\": \"phone\"}\n{\"key\": 1.5, \"kind\": 1}\n", {}, 2,
+        QStringLiteral("2 of 3 lines cannot run; nothing was run"));
 
-    // Run: the closing line counts checks and failures.
-    QTest::newRow("all checks pass")
-            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n") << 0
-            << QStringLiteral(": all 2 checks passed");
-    QTest::newRow("one of three checks fails")
-            << QByteArray("{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
-                          "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
-            << 1 << QStringLiteral(": 1 of 3 checks failed (line 2)");
-    QTest::newRow("a call after QML deleted the controller")
-            << QByteArray("{\"call\": \"deleteLater\"}\n{\"intent\": 1, \"args\": [\"0123\"]}\n"
-                          "{\"call\": \"endCall\"}\n")
-            << 1 << QStringLiteral(": 1 step could not be applied (line 3)");
-    QTest::newRow("an answer to a popup that is not open")
-            << QByteArray("{\"answer\": \"PHONE.RoamingWarning\"}\n") << 1
-            << QStringLiteral(": 1 step could not be applied (line 1)");
-    QTest::newRow("a year at a time, twice")
-            << QByteArray("{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
-                          "{\"expect\": {\"view\": \"PhoneMenu\"}}\n")
-            << 1 << QStringLiteral("63072000.000  check");
+    // Run: the closing line counts checks and failures; in JSON a summary record ends the run.
+    row("all checks pass", {}, "{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n", {},
+        0, QStringLiteral(": all 2 checks passed"));
+    row("one of three checks fails", {},
+        "{\"expect\": {\"view\": \"HOST.Home\", \"phone.status\": 0}}\n"
+        "{\"expect\": {\"view\": \"PhoneMenu\"}}\n",
+        {}, 1, QStringLiteral(": 1 of 3 checks failed (line 2)"));
+    row("summary of a failed run", {QStringLiteral("--json")},
+        "{\"open\": \"phone\"}\n{\"expect\": {\"view\": \"PhoneMenu\"}}\n", {}, 1,
+        QStringLiteral("\"out\":\"step\",\"line\":1,"));
+    row("an answer to a popup that is not open", {}, "{\"answer\": \"PHONE.RoamingWarning\"}\n",
+        {}, 1, QStringLiteral(": 1 step could not be applied (line 1)"));
+    row("a year at a time, twice", {},
+        "{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
+        "{\"expect\": {\"view\": \"PhoneMenu\"}}\n",
+        {}, 1, QStringLiteral("63072000.000  check"));
+    // A call is made as QML makes it: the engine converts the string to the slot's int.
+    row("a call converted by QML", {},
+        "{\"call\": \"viewTextMessageOptions\", \"args\": [\"2\"]}\n"
+        "{\"expect\": {\"out\": \"event\", \"name\": \"HmiPhoneSms_ViewTextMessageOptions\", "
+        "\"value\": 2}}\n",
+        {}, 0, QStringLiteral("the one check passed"));
+
+    // Invariants hold from the start of the machine on: the set-up before it is not judged.
+    const QByteArray setUp = "{\"set\": \"bluetooth.deviceConnected\", \"value\": true}\n"
+                             "{\"set\": \"phone.status\", \"value\": 7}\n{\"start\": true}\n"
+                             "{\"expect\": {\"phone.status\": 7}}\n";
+    const QStringList invariants{QStringLiteral("--check-invariants")};
+    row("invariants after the set-up", invariants, setUp, {}, 0,
+        QStringLiteral("the one check passed"));
+    row("invariants of typed steps", invariants + QStringList{QStringLiteral("--interactive")},
+        setUp, "{\"call\": \"endCall\"}\n{\"set\": \"phone.status\", \"value\": 0}\n", 0,
+        QStringLiteral("> {\"set\": \"phone.status\", \"value\": 0}"));
+
+    // The command line: 2 for what cannot run, options that would do nothing refused.
+    row("unknown option", {QStringLiteral("--frobnicate")}, open, {}, 2,
+        QStringLiteral("Unknown option 'frobnicate'"));
+    row("version", {QStringLiteral("--version")}, {}, {}, 0, QStringLiteral("hmiphone-sim 1.0"));
+    row("steps without random", {QStringLiteral("--steps"), QStringLiteral("5")}, open, {}, 2,
+        QStringLiteral("--steps goes with --random"));
+    row("write-scenario without random", {QStringLiteral("--write-scenario"), QStringLiteral("x")},
+        open, {}, 2, QStringLiteral("--write-scenario goes with --random"));
+    row("invariants in the window", invariants + QStringList{QStringLiteral("--window")}, open, {},
+        2, QStringLiteral("--check-invariants does not check the steps of --window"));
+    row("invariants in a soak",
+        invariants + QStringList{QStringLiteral("--random"), QStringLiteral("1")}, {}, {}, 2,
+        QStringLiteral("--random checks the invariants anyway"));
+    // Without a display (no X server, the offscreen platform not chosen) or without the window
+    // built in, --window says so and exits 2 instead of aborting.
+    row("window without a display",
+        {QStringLiteral("--window"), QStringLiteral("-platform"), QStringLiteral("xcb")}, {}, {}, 2,
+        QStringLiteral("--window"));
 }
 
 void SimulatorTest::scenarioFile()
 {
+    QFETCH(QStringList, options);
     QFETCH(QByteArray, scenario);
+    QFETCH(QByteArray, input);
     QFETCH(int, exitCode);
     QFETCH(QString, message);
 
     QVERIFY(m_dir.isValid());
-    const QString path = m_dir.filePath(QStringLiteral("scenario.jsonl"));
-    QFile file(path);
-    QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
-    file.write(scenario);
-    file.close();
+    QStringList arguments = QStringList{QStringLiteral("--log"), QStringLiteral("none")} + options;
+    if (!scenario.isEmpty()) {
+        const QString path = m_dir.filePath(QStringLiteral("scenario.jsonl"));
+        QFile file(path);
+        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
+        file.write(scenario);
+        file.close();
+        arguments.append(path);
+    }
 
     QProcess simulator;
-    simulator.start(QStringLiteral(HMIPHONE_SIM_FILE),
-                    {QStringLiteral("--log"), QStringLiteral("none"), path});
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.remove(QStringLiteral("DISPLAY"));
+    environment.remove(QStringLiteral("WAYLAND_DISPLAY"));
+    environment.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("offscreen"));
+    simulator.setProcessEnvironment(environment);
+    simulator.start(QStringLiteral(HMIPHONE_SIM_FILE), arguments);
+    QVERIFY(simulator.waitForStarted());
+    simulator.write(input);
+    simulator.closeWriteChannel();
     QVERIFY(simulator.waitForFinished(30000));
     const QString out = QString::fromUtf8(simulator.readAllStandardOutput());
     const QString err = QString::fromUtf8(simulator.readAllStandardError());
+    QVERIFY2(simulator.exitStatus() == QProcess::NormalExit, qPrintable(out + err));
     QVERIFY2(simulator.exitCode() == exitCode, qPrintable(out + err));
     QVERIFY2((out + err).contains(message), qPrintable(out + err));
     if (exitCode == 2)
         QVERIFY2(!out.contains(QLatin1String(" view ")), qPrintable(out));
+    // In JSON the last line is the run's summary, with the counts that set the exit code.
+    if (options.contains(QLatin1String("--json")) && exitCode != 2) {
+        const QJsonObject summary
+                = QJsonDocument::fromJson(out.trimmed().section(QLatin1Char('\n'), -1).toUtf8())
+                          .object();
+        QCOMPARE(summary.value(QLatin1String("out")).toString(), QStringLiteral("summary"));
+        QCOMPARE(summary.value(QLatin1String("failures")).toInt() > 0, exitCode == 1);
+    }
 }
 
 QTEST_GUILESS_MAIN(SimulatorTest)

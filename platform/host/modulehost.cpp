@@ -64,11 +64,14 @@ ModuleHost::~ModuleHost()
 
 bool ModuleHost::load(const QString &pluginFile)
 {
-    if (!QFileInfo(pluginFile).isFile()) {
+    const QFileInfo file(pluginFile);
+    if (!file.isFile()) {
         m_error = QStringLiteral("cannot load %1: no such file").arg(pluginFile);
         return false;
     }
-    m_loader.setFileName(pluginFile);
+    // QPluginLoader looks for a relative name in the library paths, not the working directory:
+    // the file found here is the one loaded.
+    m_loader.setFileName(file.absoluteFilePath());
     const QString iid = m_loader.metaData().value(QLatin1String("IID")).toString();
     if (iid.isEmpty()) {
         m_error = QStringLiteral("cannot load %1: not a Qt plug-in (%2)")

@@ -47,7 +47,8 @@ public:
     explicit ModuleHost(QObject *parent = nullptr);
     ~ModuleHost() override;
 
-    // Loads the plug-in file, checking that it offers the module interface.
+    // Loads the plug-in file (a relative path is taken from the working directory), checking
+    // that it offers the module interface.
     bool load(const QString &pluginFile);
     // Uses a module that is linked into the program instead of a plug-in file.
     void use(Taldris::ModuleInterface *module);

@@ -38,12 +38,15 @@
 //             int phonebookContactDisplayType (m); int driverRestrictedPhonebookModelMinRow (m)
 //             = -1, driverRestrictedPhonebookModelMaxRow (m) = -1;
 //             MultiDPListModel *AlphabetIndexModel() (roles "alphabet", "letterIndex");
-//             InfiniteListModel *phoneBook()
-//   recent    int recentCallListStatus [recentCallListStatusChanged(int)] (1 available,
-//             3 downloading, 4 failed call, 5 retry error, 0/6 failed);
-//             int currentRecentCallListType (m); PhoneSource::RecentCallListType is int
+//             InfiniteListModel *phoneBook() (roles "name", "number")
+//   recent    int recentCallListStatus [recentCallListStatusChanged(int)] (1 available for
+//             download, 2 downloaded, 3 downloading, 4 failed call, 5 retry error, 0/6 failed);
+//             int currentRecentCallListType (m) (0 all, 1 missed, 2 received, 3 dialled);
+//             PhoneSource::RecentCallListType is int; MultiDPListModel *recentCallList()
+//             (roles "name", "number", "type", "time": the list last downloaded)
 //   messages  int messagesDownloadingStatus [messagesDownloadingStatusChanged(int)] (2 running,
-//             3 finished, 4 failed); bool messagesInboxEmptyStatus = true, messagesInMemoryStatus,
+//             3 finished, 4 failed); MultiDPListModel *textMessageList() (roles "name",
+//             "number", "time", "text", "read": the inbox last downloaded); bool messagesInboxEmptyStatus = true, messagesInMemoryStatus,
 //             messageNotificationEnabled, messageAccessProfileStatus,
 //             smsMessageAccessProfileAvailable, smsPhoneDeclinedAccessStatus (read
 //             getSmsPhoneDeclinedAccess()); int numOfSmsDownloadAttempts, smsTotalCount

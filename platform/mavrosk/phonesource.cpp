@@ -6,6 +6,8 @@ PhoneSource::PhoneSource()
     : DataSource(QStringLiteral("phone"))
     , m_alphabetIndexModel(new MultiDPListModel(this))
     , m_phoneBook(new InfiniteListModel(this))
+    , m_recentCallList(new MultiDPListModel(this))
+    , m_textMessageList(new MultiDPListModel(this))
 {
     // The views call the two model getters from QML, which needs their return types by name.
     qRegisterMetaType<MultiDPListModel *>();
@@ -28,11 +30,23 @@ InfiniteListModel *PhoneSource::phoneBook() const
     return m_phoneBook;
 }
 
+MultiDPListModel *PhoneSource::recentCallList() const
+{
+    return m_recentCallList;
+}
+
+MultiDPListModel *PhoneSource::textMessageList() const
+{
+    return m_textMessageList;
+}
+
 void PhoneSource::resetModels()
 {
     m_alphabetIndexModel->setRows({});
     m_phoneBook->setRows({});
     m_phoneBook->setListLength(0);
+    m_recentCallList->setRows({});
+    m_textMessageList->setRows({});
 }
 
 void PhoneSource::setStatus(int value)

@@ -126,8 +126,15 @@ public:
 
     // Alphabet bar of the contact list: roles "alphabet" (QString) and "letterIndex" (int).
     Q_INVOKABLE Mavrosk::MultiDPListModel *AlphabetIndexModel() const;
-    // The contact list.
+    // The contact list: roles "name" and "number" (QString).
     Q_INVOKABLE Mavrosk::InfiniteListModel *phoneBook() const;
+    // The recent calls of the list type last downloaded, newest first: roles "name" (QString,
+    // empty for a number not in the contacts), "number" (QString), "type" (int: 1 missed,
+    // 2 received, 3 dialled) and "time" (QString, "yyyy-MM-dd hh:mm").
+    Q_INVOKABLE Mavrosk::MultiDPListModel *recentCallList() const;
+    // The text messages of the inbox, newest first: roles "name", "number", "time" (as above),
+    // "text" (QString) and "read" (bool).
+    Q_INVOKABLE Mavrosk::MultiDPListModel *textMessageList() const;
 
     int status() const { return m_status; }
     bool incomingCall() const { return m_incomingCall; }
@@ -396,6 +403,8 @@ private:
 
     MultiDPListModel *m_alphabetIndexModel;
     InfiniteListModel *m_phoneBook;
+    MultiDPListModel *m_recentCallList;
+    MultiDPListModel *m_textMessageList;
     int m_status = 0;
     bool m_incomingCall = false;
     bool m_callConnected = false;

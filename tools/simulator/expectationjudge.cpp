@@ -6,6 +6,8 @@
 #include <brisken/datastore.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
+#include <mavrosk/infinitelistmodel.h>
+#include <mavrosk/phonesource.h>
 #include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 
@@ -69,8 +71,27 @@ bool valuesMatch(const QJsonValue &actual, const QJsonValue &expected)
     return actual == expected;
 }
 
+// The bridge's list models by name; a check of one compares its number of rows.
+QAbstractItemModel *listModel(const QString &name)
+{
+    Mavrosk::PhoneSource *phone = Mavrosk::PhoneSource::instance();
+    if (name == QLatin1String("phone.phoneBook"))
+        return phone->phoneBook();
+    if (name == QLatin1String("phone.AlphabetIndexModel"))
+        return phone->AlphabetIndexModel();
+    if (name == QLatin1String("phone.recentCallList"))
+        return phone->recentCallList();
+    if (name == QLatin1String("phone.textMessageList"))
+        return phone->textMessageList();
+    return nullptr;
+}
+
 bool readValue(const QString &name, QObject *controller, QVariant *value, QString *error)
 {
+    if (QAbstractItemModel *model = listModel(name)) {
+        *value = model->rowCount();
+        return true;
+    }
     if (name == QLatin1String("host.transients")) {
         auto *statusBar = Brisken::DataStore::get<Brisken::StatusBarController>(
                 QStringLiteral("StatusBarController"));
@@ -211,7 +232,7 @@ QString ExpectationJudge::checkNames(const QJsonObject &checks, QObject *control
         }
         if (!key.contains(QLatin1Char('.')))
             return QStringLiteral("unknown check \"%1\"").arg(key);
-        if (key.startsWith(QLatin1String("controller.")) && !controller)
+        if ((key.startsWith(QLatin1String("controller.")) && !controller) || listModel(key))
             continue;
         const NamedValue named = ScenarioReader::resolve(key, controller);
         if (!named.isValid())

@@ -18,6 +18,8 @@ struct ScenarioStep;
 //   "view", "popup", "nopopup", "top", "state": what is on screen (a popup is open, on top or
 //   covered; "top" is the popup shown on top of its region) and which states are active;
 //   a value name ("phone.status", "controller.isEmptyNumber", "host.transients"): its value;
+//   a list model ("phone.phoneBook", "phone.recentCallList", "phone.textMessageList",
+//   "phone.AlphabetIndexModel"): its number of rows;
 //   "out" with fields: an output of that kind written since the last input.
 // An "expect-not" step negates each of its checks.
 class ExpectationJudge

@@ -10,7 +10,9 @@
 #include "scenariostep.h"
 #include "simulatedphone.h"
 #include "virtualeventdispatcher.h"
+#ifdef HMIPHONE_WITH_WINDOW
 #include "window/headunitwindow.h"
+#endif
 
 #include <host/modulehost.h>
 #include <mavrosk/bridge.h>
@@ -84,6 +86,22 @@ void printError(const QString &message)
     std::fprintf(stderr, "hmiphone-sim: %s\n", message.toLocal8Bit().constData());
 }
 
+#ifdef HMIPHONE_WITH_WINDOW
+// While the window's application starts: Qt ends the program when no display can be had; the
+// simulator says so and exits as one that cannot run.
+void windowStartHandler(QtMsgType type, const QMessageLogContext &, const QString &message)
+{
+    if (type != QtFatalMsg) {
+        std::fprintf(stderr, "%s\n", message.toLocal8Bit().constData());
+        return;
+    }
+    printError(QStringLiteral("--window: no display to show the window on (%1); "
+                              "--screenshots needs none")
+                       .arg(message.section(QLatin1Char('\n'), 0, 0).trimmed()));
+    std::_Exit(CannotRun);
+}
+#endif
+
 // Plays random steps until one violates an invariant; the scenario so far goes to the file
 // asked for, or beside the program's working directory when a violation needs it.
 int runSoak(Simulator::ScenarioRunner *runner, Host::ModuleHost *host, quint32 seed, qint64 steps,
@@ -153,6 +171,9 @@ int main(int argc, char *argv[])
     } else {
         QCoreApplication::setEventDispatcher(clock);
     }
+#ifdef HMIPHONE_WITH_WINDOW
+    const QtMessageHandler handler
+            = display == Display::Window ? qInstallMessageHandler(windowStartHandler) : nullptr;
     std::unique_ptr<QCoreApplication> application(
             display == Display::None
                     ? new QCoreApplication(argc, argv)
@@ -160,19 +181,29 @@ int main(int argc, char *argv[])
                             argc, argv,
                             display == Display::Window ? Simulator::HeadUnitWindow::OnScreen
                                                        : Simulator::HeadUnitWindow::OffScreen));
+    if (display == Display::Window)
+        qInstallMessageHandler(handler);
+#else
+    std::unique_ptr<QCoreApplication> application(new QCoreApplication(argc, argv));
+#endif
     QCoreApplication &app = *application;
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-sim"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(HMIPHONE_VERSION));
 
     QCommandLineParser parser;
     parser.setApplicationDescription(QStringLiteral(
             "Runs the phone module's plug-in in a simulated HMI host and plays a scenario (JSON "
             "Lines) against it on a virtual clock. Writes, one per line, what the HMI would show "
-            "and what the module asks of the phone; exits 1 when an expectation fails."));
-    parser.addHelpOption();
+            "and what the module asks of the phone. Exits 0 when every expectation holds, 1 when "
+            "one fails, 2 when it cannot run."));
+    const QCommandLineOption helpOption = parser.addHelpOption();
+    const QCommandLineOption versionOption = parser.addVersionOption();
     parser.addPositionalArgument(QStringLiteral("scenario"),
                                  QStringLiteral("Scenario file (.jsonl); \"-\" reads stdin."));
-    const QCommandLineOption jsonOption(QStringLiteral("json"),
-                                        QStringLiteral("Write outputs as JSON Lines."));
+    const QCommandLineOption jsonOption(
+            QStringLiteral("json"),
+            QStringLiteral("Write JSON Lines: each input step, each output, and a closing "
+                           "summary."));
     const QCommandLineOption pluginOption(
             QStringLiteral("plugin"),
             QStringLiteral("The module's plug-in file (default: %1).").arg(defaultPluginFile()),
@@ -181,7 +212,7 @@ int main(int argc, char *argv[])
             QStringLiteral("phone"),
             QStringLiteral("Who plays the phone: \"scripted\" (the scenario alone, the default) "
                            "or \"simulated\" (a connected phone that answers the module's "
-                           "commands)."),
+                           "commands and keeps contacts, recent calls and messages)."),
             QStringLiteral("mode"), QStringLiteral("scripted"));
     const QCommandLineOption interactiveOption(
             QStringLiteral("interactive"),
@@ -189,8 +220,9 @@ int main(int argc, char *argv[])
                            "they happen."));
     const QCommandLineOption logOption(
             QStringLiteral("log"),
-            QStringLiteral("Lowest level of the module's log lines written: debug, info, warning, "
-                           "critical or none (default: debug)."),
+            QStringLiteral("Lowest level of the log lines written, the module's and the "
+                           "platform's: debug, info, warning, critical or none (default: "
+                           "debug)."),
             QStringLiteral("level"), QStringLiteral("debug"));
     const QCommandLineOption windowOption(
             QStringLiteral("window"),
@@ -208,24 +240,59 @@ int main(int argc, char *argv[])
             QStringLiteral("Play random steps from this seed instead of a scenario, checking the "
                            "invariants after every step; exits 1 on the first violation."),
             QStringLiteral("seed"));
-    const QCommandLineOption stepsOption(QStringLiteral("steps"),
-                                         QStringLiteral("Number of random steps (default: 10000)."),
-                                         QStringLiteral("count"), QStringLiteral("10000"));
+    const QCommandLineOption stepsOption(
+            QStringLiteral("steps"),
+            QStringLiteral("With --random: the number of random steps (default: 10000)."),
+            QStringLiteral("count"), QStringLiteral("10000"));
     const QCommandLineOption writeScenarioOption(
             QStringLiteral("write-scenario"),
             QStringLiteral("With --random: write the steps played to this scenario file."),
             QStringLiteral("file"));
     const QCommandLineOption invariantsOption(
             QStringLiteral("check-invariants"),
-            QStringLiteral("Check the soak's invariants after every step of the scenario."));
+            QStringLiteral("Check the soak's invariants after every input step once the machine "
+                           "runs (scenario, typed and --screenshots steps); exits 1 on the first "
+                           "violation."));
     parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
                        windowOption, screenshotsOption, randomOption, stepsOption,
                        writeScenarioOption, invariantsOption});
-    parser.process(app);
+    // A command line the simulator cannot run exits 2, like any other reason it cannot run.
+    if (!parser.parse(QCoreApplication::arguments())) {
+        printError(parser.errorText() + QStringLiteral(" (see --help)"));
+        return CannotRun;
+    }
+    if (parser.isSet(helpOption))
+        parser.showHelp(Passed);
+    if (parser.isSet(versionOption))
+        parser.showVersion();
 
     const bool interactive = parser.isSet(interactiveOption);
     const bool random = parser.isSet(randomOption);
     const QStringList positional = parser.positionalArguments();
+    // Options that would do nothing in the mode chosen are refused, not ignored.
+    const QString refused = !random && parser.isSet(stepsOption)
+            ? QStringLiteral("--steps goes with --random")
+            : !random && parser.isSet(writeScenarioOption)
+            ? QStringLiteral("--write-scenario goes with --random")
+            : parser.isSet(invariantsOption) && display == Display::Window
+            ? QStringLiteral("--check-invariants does not check the steps of --window; "
+                             "--screenshots plays a scenario with them")
+            : parser.isSet(invariantsOption) && random
+            ? QStringLiteral("--random checks the invariants anyway; no --check-invariants")
+            : parser.isSet(windowOption) && parser.isSet(screenshotsOption)
+            ? QStringLiteral("either --window or --screenshots")
+            : QString();
+    if (!refused.isEmpty()) {
+        printError(refused);
+        return CannotRun;
+    }
+#ifndef HMIPHONE_WITH_WINDOW
+    if (display != Display::None) {
+        printError(QStringLiteral("this hmiphone-sim was built without its window "
+                                  "(HMIPHONE_BUILD_WINDOW=OFF): no --window, no --screenshots"));
+        return CannotRun;
+    }
+#endif
     if (random ? !positional.isEmpty() || interactive || display != Display::None
                : positional.size() > 1
                         || (positional.isEmpty() && !interactive && display != Display::Window)) {
@@ -249,7 +316,7 @@ int main(int argc, char *argv[])
         printError(QStringLiteral("--phone is scripted or simulated"));
         return CannotRun;
     }
-    // A soak writes only what went wrong: the module's log lines are not even formatted.
+    // A soak writes only what went wrong: the log lines are not even formatted.
     const int level = logLevel(random && !parser.isSet(logOption) ? QStringLiteral("none")
                                                                   : parser.value(logOption));
     if (level < 0) {
@@ -288,14 +355,14 @@ int main(int argc, char *argv[])
     Host::ModuleHost host;
     const QString pluginFile = parser.value(pluginOption);
     if (!host.load(pluginFile)) {
-        printError(QStringLiteral("cannot load %1: %2").arg(pluginFile, host.errorString()));
+        printError(host.errorString());
         return CannotRun;
     }
     QQmlEngine engine;
 
     Simulator::SimulatedPhone *phone = nullptr;
     if (phoneMode == QLatin1String("simulated")) {
-        phone = new Simulator::SimulatedPhone(&app);
+        phone = new Simulator::SimulatedPhone(clock, &app);
         phone->connectPhone();
     }
 
@@ -322,12 +389,35 @@ int main(int argc, char *argv[])
     if (random)
         return runSoak(&runner, &host, seed, randomSteps, parser.value(writeScenarioOption));
 
+    // Every input step once the machine runs is checked against the invariants, wherever it
+    // comes from; after the first violation nothing more is played.
+    std::unique_ptr<Simulator::Invariants> invariants;
+    if (parser.isSet(invariantsOption))
+        invariants = std::make_unique<Simulator::Invariants>(&host);
+    QString violation;
+    auto play = [&](const Simulator::ScenarioStep &step, const QString &source) {
+        if (!violation.isEmpty())
+            return false;
+        runner.play(step);
+        if (invariants && step.isInput() && runner.started())
+            violation = invariants->check(runner.controller());
+        if (violation.isEmpty())
+            return true;
+        printError(QStringLiteral("%1:%2: invariant violated: %3")
+                           .arg(source)
+                           .arg(step.line)
+                           .arg(violation));
+        return false;
+    };
+
+    int pictures = 0;
     if (display != Display::None) {
+#ifdef HMIPHONE_WITH_WINDOW
         // Steps of the window's panels are checked as they come, like typed ones.
-        auto play = [&runner, &output](const Simulator::ScenarioStep &step) {
+        auto playChecked = [&](const Simulator::ScenarioStep &step) {
             const QString error = Simulator::ScenarioReader::check(step, runner.controller());
             if (error.isEmpty())
-                runner.play(step);
+                play(step, scenarioName);
             else
                 output.note(QStringLiteral("# %1 cannot run: %2").arg(step.text, error));
         };
@@ -336,7 +426,7 @@ int main(int argc, char *argv[])
                 return step.kind == Simulator::ScenarioStep::Start;
             }))
             runner.finish();
-        Simulator::HeadUnitWindow window(&engine, &output, clock, play,
+        Simulator::HeadUnitWindow window(&engine, &output, clock, playChecked,
                                          display == Display::Window
                                                  ? Simulator::HeadUnitWindow::OnScreen
                                                  : Simulator::HeadUnitWindow::OffScreen);
@@ -346,7 +436,7 @@ int main(int argc, char *argv[])
             app.exec();
         } else {
             QString error;
-            const int pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
+            pictures = window.writeScreenshots(parser.value(screenshotsOption), &error);
             if (pictures < 0) {
                 printError(error);
                 return CannotRun;
@@ -355,26 +445,15 @@ int main(int argc, char *argv[])
                                 .arg(pictures)
                                 .arg(parser.value(screenshotsOption)));
         }
+#endif
     } else {
-        std::unique_ptr<Simulator::Invariants> invariants;
-        if (parser.isSet(invariantsOption))
-            invariants = std::make_unique<Simulator::Invariants>(&host);
         for (const Simulator::ScenarioStep &step : steps) {
-            runner.play(step);
-            const QString violation = invariants && step.isInput()
-                    ? invariants->check(runner.controller())
-                    : QString();
-            if (!violation.isEmpty()) {
-                printError(QStringLiteral("%1:%2: invariant violated: %3")
-                                   .arg(scenarioName)
-                                   .arg(step.line)
-                                   .arg(violation));
-                return ChecksFailed;
-            }
+            if (!play(step, scenarioName))
+                break;
         }
     }
-    int refused = 0;
-    if (interactive) {
+    int refusedSteps = 0;
+    if (interactive && violation.isEmpty()) {
         // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot
         // run is refused on its own.
         std::string typed;
@@ -384,18 +463,30 @@ int main(int argc, char *argv[])
             const QString error = Simulator::ScenarioReader::check(step, runner.controller());
             if (!error.isEmpty()) {
                 printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
-                ++refused;
+                ++refusedSteps;
                 continue;
             }
-            runner.play(step);
+            if (!play(step, QStringLiteral("stdin")))
+                break;
         }
     }
-    runner.finish();
+    if (violation.isEmpty())
+        runner.finish();
     if (!runner.setUpError().isEmpty()) {
         printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
         return CannotRun;
     }
 
+    // What tools read last: the counts of the run.
+    output.record(QStringLiteral("summary"),
+                  {{QStringLiteral("checks"), runner.checks()},
+                   {QStringLiteral("failures"), runner.failures()},
+                   {QStringLiteral("errors"), runner.stepErrors()},
+                   {QStringLiteral("refused"), refusedSteps},
+                   {QStringLiteral("violations"), violation.isEmpty() ? 0 : 1},
+                   {QStringLiteral("pictures"), pictures}});
+    if (!violation.isEmpty())
+        return ChecksFailed;
     if (runner.failures() > 0 || runner.stepErrors() > 0) {
         QStringList failedLines;
         for (int line : runner.failedLines())
@@ -417,7 +508,7 @@ int main(int argc, char *argv[])
                                 failedLines.join(QStringLiteral(", "))));
         return ChecksFailed;
     }
-    if (refused > 0)
+    if (refusedSteps > 0)
         return CannotRun;
     output.note(
             QStringLiteral("# %1: %2")

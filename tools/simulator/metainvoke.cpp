@@ -20,25 +20,14 @@ bool matchesType(const QMetaMethod &method, QMetaMethod::MethodType type)
 }
 
 // Converts the arguments to the method's parameter types; false when one does not convert.
-// `lenient`: as QML does, a value that does not convert passes as the type's empty value (0,
-// false, an empty string).
 bool convertArguments(const QMetaMethod &method, const QVariantList &args,
-                      std::array<QVariant, MaximumArguments> *converted, bool lenient)
+                      std::array<QVariant, MaximumArguments> *converted)
 {
     for (int i = 0; i < args.size(); ++i) {
         const int type = method.parameterType(i);
         QVariant value = args.at(i);
-        if (type == QMetaType::QVariant) {
-            (*converted)[i] = value;
-            continue;
-        }
-        if (type == QMetaType::UnknownType)
+        if (type != QMetaType::QVariant && (type == QMetaType::UnknownType || !value.convert(type)))
             return false;
-        if (!value.convert(type)) {
-            if (!lenient)
-                return false;
-            value = QVariant(type, nullptr);
-        }
         (*converted)[i] = value;
     }
     return true;
@@ -62,46 +51,43 @@ bool invokeByName(QObject *object, const QString &name, const QVariantList &args
     const QMetaObject *metaObject = object->metaObject();
     const QByteArray methodName = name.toLatin1();
     bool nameFound = false;
-    // An overload whose parameters the arguments convert to first; else, as QML would, the
-    // first of that name and number of parameters with what does not convert left empty.
-    for (int pass = 0; pass < 2; ++pass) {
-        for (int index = metaObject->methodCount() - 1; index >= 0; --index) {
-            const QMetaMethod method = metaObject->method(index);
-            if (method.name() != methodName || !matchesType(method, type))
-                continue;
-            nameFound = true;
-            if (method.parameterCount() != args.size())
-                continue;
-            std::array<QVariant, MaximumArguments> converted;
-            if (!convertArguments(method, args, &converted, pass == 1))
-                continue;
+    // The last-declared overload whose parameters the arguments convert to.
+    for (int index = metaObject->methodCount() - 1; index >= 0; --index) {
+        const QMetaMethod method = metaObject->method(index);
+        if (method.name() != methodName || !matchesType(method, type))
+            continue;
+        nameFound = true;
+        if (method.parameterCount() != args.size())
+            continue;
+        std::array<QVariant, MaximumArguments> converted;
+        if (!convertArguments(method, args, &converted))
+            continue;
 
-            std::array<QGenericArgument, MaximumArguments> arguments;
-            for (int i = 0; i < args.size(); ++i) {
-                const bool isVariant = method.parameterType(i) == QMetaType::QVariant;
-                arguments[i] = QGenericArgument(isVariant ? "QVariant" : converted[i].typeName(),
-                                                isVariant ? static_cast<const void *>(&converted[i])
-                                                          : converted[i].constData());
-            }
-            QVariant returned;
-            QGenericReturnArgument returnArgument;
-            const int returnType = method.returnType();
-            if (result && returnType != QMetaType::Void && returnType != QMetaType::UnknownType) {
-                returned = QVariant(returnType, nullptr);
-                returnArgument = QGenericReturnArgument(method.typeName(), returned.data());
-            }
-            const bool invoked = method.invoke(
-                    object, Qt::DirectConnection, returnArgument, arguments[0], arguments[1],
-                    arguments[2], arguments[3], arguments[4], arguments[5], arguments[6],
-                    arguments[7], arguments[8], arguments[9]);
-            if (!invoked) {
-                *error = QStringLiteral("%1 %2 could not be called").arg(what, name);
-                return false;
-            }
-            if (result)
-                *result = returned;
-            return true;
+        std::array<QGenericArgument, MaximumArguments> arguments;
+        for (int i = 0; i < args.size(); ++i) {
+            const bool isVariant = method.parameterType(i) == QMetaType::QVariant;
+            arguments[i] = QGenericArgument(isVariant ? "QVariant" : converted[i].typeName(),
+                                            isVariant ? static_cast<const void *>(&converted[i])
+                                                      : converted[i].constData());
         }
+        QVariant returned;
+        QGenericReturnArgument returnArgument;
+        const int returnType = method.returnType();
+        if (result && returnType != QMetaType::Void && returnType != QMetaType::UnknownType) {
+            returned = QVariant(returnType, nullptr);
+            returnArgument = QGenericReturnArgument(method.typeName(), returned.data());
+        }
+        const bool invoked = method.invoke(object, Qt::DirectConnection, returnArgument,
+                                           arguments[0], arguments[1], arguments[2], arguments[3],
+                                           arguments[4], arguments[5], arguments[6], arguments[7],
+                                           arguments[8], arguments[9]);
+        if (!invoked) {
+            *error = QStringLiteral("%1 %2 could not be called").arg(what, name);
+            return false;
+        }
+        if (result)
+            *result = returned;
+        return true;
     }
     *error = nameFound ? QStringLiteral("%1 %2 takes no %3 argument(s) of these types")
                                  .arg(what, name)

@@ -135,6 +135,31 @@ void OutputWriter::note(const QString &text)
     std::fflush(m_stream);
 }
 
+void OutputWriter::echoStep(int line, const QString &text)
+{
+    const qint64 time = m_clock ? m_clock->now() : 0;
+    const QString human = QStringLiteral("%1  > %2")
+                                  .arg(QString::number(double(time) / 1000.0, 'f', 3), 9)
+                                  .arg(text);
+    if (m_format == Human || m_silent) {
+        note(human);
+        return;
+    }
+    emit written(human);
+    record(QStringLiteral("step"),
+           {{QStringLiteral("line"), line}, {QStringLiteral("text"), text}});
+}
+
+void OutputWriter::record(const QString &kind, const QVariantMap &fields)
+{
+    if (m_format != Json || m_silent)
+        return;
+    const QString line = toJsonLine({m_clock ? m_clock->now() : 0, kind, fields});
+    std::fputs(line.toUtf8().constData(), m_stream);
+    std::fputc('\n', m_stream);
+    std::fflush(m_stream);
+}
+
 void OutputWriter::beginInput()
 {
     m_outputs.clear();
@@ -204,15 +229,19 @@ void OutputWriter::captureLog(const QString &category, int minimumLevel)
 {
     m_logCategory = category;
     m_logLevel = minimumLevel;
-    // The module's category writes only warnings by default; the simulator shows what was asked.
-    // Silent, the platform's own chatter goes too; its warnings still reach stderr.
+    // The module's category writes only warnings by default; the simulator shows what was asked,
+    // of the module's and the platform's categories alike. Silent, the rest of the chatter goes
+    // too; warnings still reach stderr. QT_LOGGING_RULES is applied after these rules.
     QString rules = m_silent ? QStringLiteral("*.debug=false\n*.info=false\n") : QString();
     const char *levels[] = {"debug", "info", "warning", "critical"};
-    for (int level = 0; level < 4; ++level)
-        rules += QStringLiteral("%1.%2=%3\n")
-                         .arg(category, QLatin1String(levels[level]),
-                              level >= minimumLevel ? QLatin1String("true")
-                                                    : QLatin1String("false"));
+    const QString platform = category.section(QLatin1Char('.'), 0, 0) + QStringLiteral(".*");
+    for (const QString &filtered : {platform, category}) {
+        for (int level = 0; level < 4; ++level)
+            rules += QStringLiteral("%1.%2=%3\n")
+                             .arg(filtered, QLatin1String(levels[level]),
+                                  level >= minimumLevel ? QLatin1String("true")
+                                                        : QLatin1String("false"));
+    }
     QLoggingCategory::setFilterRules(rules);
     s_logWriter = this;
     m_previousHandler = qInstallMessageHandler(&OutputWriter::messageHandler);

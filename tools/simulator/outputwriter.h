@@ -44,8 +44,13 @@ public:
     void setSilent(bool silent) { m_silent = silent; }
 
     void write(const QString &kind, const QVariantMap &fields = {});
-    // A line for people only (scenario comments and the steps played): human format only.
+    // A line for people only (scenario comments, the closing line): human format only.
     void note(const QString &text);
+    // An input step as it is played: "  1.500  > {...}" for people, a "step" record with its
+    // line and text in JSON. Not an output of the step: checks of "out" do not see it.
+    void echoStep(int line, const QString &text);
+    // A record for tools (the closing summary): JSON only, and no output of any step.
+    void record(const QString &kind, const QVariantMap &fields);
 
     // Starts a new input step: outputs from here on belong to it; those of earlier inputs go.
     void beginInput();
@@ -57,7 +62,8 @@ public:
     void skipNextJournalEntry(const QString &kind) { m_skipKind = kind; }
 
     // Writes the module's logging category as "log" outputs; other categories go to stderr.
-    // `minimumLevel`: 0 debug, 1 info, 2 warning, 3 critical, 4 none.
+    // `minimumLevel` (0 debug, 1 info, 2 warning, 3 critical, 4 none) applies to the module's
+    // category and the platform's ("orvane.*") alike; QT_LOGGING_RULES still refines it.
     void captureLog(const QString &category, int minimumLevel);
 
     static QString details(const Output &output);

@@ -1,5 +1,6 @@
 #include "randomsoak.h"
 
+#include "carkeys.h"
 #include "invariants.h"
 #include "scenarioreader.h"
 #include "scenariorunner.h"
@@ -19,6 +20,7 @@
 
 #include <algorithm>
 #include <climits>
+#include <iterator>
 
 namespace Simulator {
 
@@ -26,11 +28,8 @@ namespace {
 
 // Steps kept for the report of a violation.
 constexpr int RecentSteps = 30;
-// One step in this many has QML delete the controller (its inherited deleteLater()).
-constexpr int DeleteControllerOdds = 50000;
 
-// The keys and actions the module knows, tried more often than any other number.
-constexpr int Keys[] = {12, 77, 78, 49, 79, 50, 80, 90, 91};
+// The actions the module knows, tried more often than any other number (the car's keys too).
 constexpr int Actions[] = {1, 7, 28, 32, 47, 56, 67, 68};
 constexpr int OddInts[]
         = {INT_MIN, INT_MIN + 1, -1000, -2, 13, 20, 99, 1000, 1000000, INT_MAX - 1, INT_MAX};
@@ -224,8 +223,6 @@ QString RandomSoak::emitSignal()
 
 QString RandomSoak::callSlot()
 {
-    if (pick(DeleteControllerOdds) == 0)
-        return line({{QStringLiteral("call"), QStringLiteral("deleteLater")}});
     const Member &slot = m_slots.at(pick(m_slots.size()));
     const bool wrong = chance(10);
     QJsonArray args;
@@ -269,9 +266,15 @@ QString RandomSoak::nextStep()
     if (roll < 38 && !m_signals.isEmpty())
         return emitSignal();
     if (roll < 48) {
-        const int key = chance(85) ? Keys[pick(9)] : intValue().toInt();
-        const int kind = chance(85) ? 1 + pick(4) : intValue().toInt();
-        return line({{QStringLiteral("key"), key}, {QStringLiteral("kind"), kind}});
+        const int key
+                = chance(85) ? CarKeys[pick(int(std::size(CarKeys)))].code : intValue().toInt();
+        const int kind = chance(85) ? 1 + pick(int(std::size(KeyKinds))) : intValue().toInt();
+        // A key step takes the car's keys only; other numbers reach the module as the key
+        // source's signal.
+        if (carKeyError(key, kind).isEmpty())
+            return line({{QStringLiteral("key"), key}, {QStringLiteral("kind"), kind}});
+        return line({{QStringLiteral("emit"), QStringLiteral("key.keyEvent")},
+                     {QStringLiteral("args"), QJsonArray{key, kind}}});
     }
     if (roll < 70 && !m_slots.isEmpty())
         return callSlot();

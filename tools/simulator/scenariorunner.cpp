@@ -20,8 +20,10 @@
 #include <taldris/hmiintentmanager.h>
 
 #include <QJsonArray>
+#include <QJsonDocument>
 #include <QQmlContext>
 #include <QQmlEngine>
+#include <QQmlExpression>
 
 namespace Simulator {
 
@@ -159,9 +161,7 @@ void ScenarioRunner::play(const ScenarioStep &step)
     const bool beforeStart = !m_started && (m_startDeferred || step.kind == ScenarioStep::Start);
     if (!beforeStart)
         start();
-    m_output->note(QStringLiteral("%1  > %2")
-                           .arg(QString::number(double(m_clock->now()) / 1000.0, 'f', 3), 9)
-                           .arg(step.text));
+    m_output->echoStep(step.line, step.text);
     m_output->beginInput();
     if (step.kind == ScenarioStep::Start) {
         start();
@@ -236,15 +236,12 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
         Mavrosk::KeySource::instance()->sendKeyEvent(step.value("key").toInt(),
                                                      step.value("kind").toInt());
         return QString();
-    case ScenarioStep::Call: {
-        QObject *target = controller();
-        if (!target)
+    case ScenarioStep::Call:
+        if (!controller())
             return QStringLiteral("the module exports no %1").arg(ControllerProperty);
-        invokeByName(target, step.name(), args, QMetaMethod::Slot, &error);
-        return error;
-    }
+        return callAsQml(step.name(), step.value("args").toArray());
     case ScenarioStep::Answer:
-        return answer(step, args);
+        return answer(step);
     case ScenarioStep::Intent: {
         const int action = step.value("intent").toInt();
         m_output->skipNextJournalEntry(QStringLiteral("intent"));
@@ -296,10 +293,26 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
     }
 }
 
+QString ScenarioRunner::callAsQml(const QString &slot, const QJsonArray &args)
+{
+    // A view's call, made by the engine the module exported its controller to: the controller
+    // found by its context name, the overload and the argument conversions QML's own.
+    const QString name
+            = QString::fromUtf8(QJsonDocument(QJsonArray{slot}).toJson(QJsonDocument::Compact));
+    QQmlExpression call(
+            m_engine->rootContext(), nullptr,
+            QStringLiteral("%1[%2].apply(%1, %3)")
+                    .arg(ControllerProperty, name.mid(1, name.size() - 2),
+                         QString::fromUtf8(QJsonDocument(args).toJson(QJsonDocument::Compact))));
+    call.evaluate();
+    return call.hasError() ? QStringLiteral("%1: %2").arg(slot, call.error().description())
+                           : QString();
+}
+
 // The driver taps a button of an open popup (on top or covered): the answer is traced, the
 // button's controller call made, and once its events have been handled the framework closes the
 // popup if the module leaves that to it.
-QString ScenarioRunner::answer(const ScenarioStep &step, const QVariantList &args)
+QString ScenarioRunner::answer(const ScenarioStep &step)
 {
     const QString wanted = step.name();
     QString id;
@@ -313,15 +326,13 @@ QString ScenarioRunner::answer(const ScenarioStep &step, const QVariantList &arg
     const QString call = step.value("call").toString();
     if (!call.isEmpty()) {
         fields.insert(QStringLiteral("call"), call);
-        fields.insert(QStringLiteral("args"), args);
+        fields.insert(QStringLiteral("args"), step.value("args").toArray().toVariantList());
     }
     m_output->write(QStringLiteral("answer"), fields);
     if (!call.isEmpty()) {
-        QObject *target = controller();
-        if (!target)
+        if (!controller())
             return QStringLiteral("the module exports no %1").arg(ControllerProperty);
-        QString error;
-        invokeByName(target, call, args, QMetaMethod::Slot, &error);
+        const QString error = callAsQml(call, step.value("args").toArray());
         if (!error.isEmpty())
             return error;
     }

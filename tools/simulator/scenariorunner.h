@@ -3,6 +3,7 @@
 #include "scenarioreader.h"
 #include "scenariostep.h"
 
+#include <QJsonArray>
 #include <QList>
 #include <QObject>
 #include <QPointer>
@@ -70,11 +71,14 @@ private:
     // Applies an input step; empty or why it could not be applied.
     QString apply(const ScenarioStep &step);
     QString writeValue(const QString &name, const QJsonValue &value);
+    // Calls a slot of the controller through the QML engine, as a view does; empty or why the
+    // call failed.
+    QString callAsQml(const QString &slot, const QJsonArray &args);
     void report(int line, const QString &message);
     // {"open": "settings/<entry>"}: the settings menu's entry, chosen as the driver would; empty
     // or why it could not be.
     QString chooseSettingsEntry(const QString &entry);
-    QString answer(const ScenarioStep &step, const QVariantList &args);
+    QString answer(const ScenarioStep &step);
 
     Host::ModuleHost *m_host;
     QQmlEngine *m_engine;

@@ -1,5 +1,7 @@
 #include "scenariostep.h"
 
+#include "carkeys.h"
+
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonParseError>
@@ -82,10 +84,12 @@ QString checkFields(const ScenarioStep &step, const char *key)
     case ScenarioStep::Key: {
         if (!has("kind"))
             return QStringLiteral("\"key\" needs a \"kind\"");
-        const QString error = checkWhole(o.value(QLatin1String("key")), "key", INT_MIN, INT_MAX);
-        return error.isEmpty()
-                ? checkWhole(o.value(QLatin1String("kind")), "kind", INT_MIN, INT_MAX)
-                : error;
+        QString error = checkWhole(o.value(QLatin1String("key")), "key", INT_MIN, INT_MAX);
+        if (error.isEmpty())
+            error = checkWhole(o.value(QLatin1String("kind")), "kind", INT_MIN, INT_MAX);
+        return error.isEmpty() ? carKeyError(o.value(QLatin1String("key")).toInt(),
+                                             o.value(QLatin1String("kind")).toInt())
+                               : error;
     }
     case ScenarioStep::Intent:
         return checkWhole(o.value(QLatin1String("intent")), "intent", INT_MIN, INT_MAX);

@@ -1,11 +1,16 @@
 #include "simulatedphone.h"
 
+#include "virtualeventdispatcher.h"
+
 #include <journal/journal.h>
 #include <mavrosk/bridge.h>
 #include <mavrosk/infinitelistmodel.h>
 #include <mavrosk/multidplistmodel.h>
 
 #include <QTimer>
+
+#include <algorithm>
+#include <iterator>
 
 namespace Simulator {
 
@@ -29,11 +34,66 @@ constexpr int TwoCalls = 9;
 constexpr int TwoCallsJoined = 10;
 // Send status while a text message is on its way (2 sent, 0 and 1 failed, 3 network failure).
 constexpr int SendingMessage = 4;
+// Phone book status.
+constexpr int ContactsDownloaded = 1;
+constexpr int ContactsDownloading = 2;
+constexpr int ContactsEmpty = 3;
+// Recent-call list status.
+constexpr int RecentCallsAvailable = 1;
+constexpr int RecentCallsDownloaded = 2;
+constexpr int RecentCallsDownloading = 3;
+// Recent-call types; list type 0 is all of them.
+constexpr int Missed = 1;
+constexpr int Received = 2;
+constexpr int Dialled = 3;
+// Messages downloading status.
+constexpr int MessagesRunning = 2;
+constexpr int MessagesFinished = 3;
+
+// The morning the phone's clock shows when the simulation starts.
+const QDateTime Morning(QDate(2024, 5, 14), QTime(9, 30), Qt::UTC);
+
+const char *const FirstNames[]
+        = {"Anna", "Ben",   "Clara", "David", "Emma", "Felix",  "Greta", "Hugo",
+           "Ida",  "Jonas", "Karla", "Leon",  "Mila", "Noah",   "Olga",  "Paul",
+           "Rosa", "Simon", "Tessa", "Uwe",   "Vera", "Walter", "Yara",  "Zoe"};
+const char *const Surnames[] = {"Becker", "Fischer", "Hartmann", "Keller", "Lorenz",
+                                "Meyer",  "Novak",   "Richter",  "Schulz", "Wagner"};
+const char *const Texts[] = {"See you at eight?",
+                             "Running ten minutes late, sorry.",
+                             "Can you pick up bread on the way home?",
+                             "Meeting moved to 3 pm.",
+                             "Call me when you land.",
+                             "Happy birthday!",
+                             "The parcel arrived.",
+                             "Where did you park?",
+                             "Thanks for today.",
+                             "Are we still on for Friday?",
+                             "Dinner is ready.",
+                             "Your table is booked for two."};
+// The order in which calls of the history alternate.
+constexpr int CallTypes[]
+        = {Missed, Received, Dialled, Dialled, Received, Received, Missed, Dialled};
+constexpr int ReplyCount = 3;
+const char *const Replies[ReplyCount]
+        = {"On my way.", "Can't talk now, I'm driving.", "I'll call you later."};
+
+// A number in the range kept for fiction, one per index.
+QString fictionalNumber(int index)
+{
+    return QStringLiteral("+44 7700 900%1").arg((index * 19) % 1000, 3, 10, QLatin1Char('0'));
+}
+
+QString timeText(const QDateTime &time)
+{
+    return time.toString(QStringLiteral("yyyy-MM-dd hh:mm"));
+}
 
 } // namespace
 
-SimulatedPhone::SimulatedPhone(QObject *parent)
+SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent)
     : QObject(parent)
+    , m_clock(clock)
     , m_dialTimer(new QTimer(this))
 {
     m_dialTimer->setSingleShot(true);
@@ -41,6 +101,40 @@ SimulatedPhone::SimulatedPhone(QObject *parent)
     connect(m_dialTimer, &QTimer::timeout, this, &SimulatedPhone::callConnected);
     connect(Platform::Journal::instance(), &Platform::Journal::appended, this,
             &SimulatedPhone::onJournalEntry);
+    // Calls and messages that come from the phone's side are remembered once they settled.
+    connect(phone(), &Mavrosk::PhoneSource::incomingCallChanged, this, [this](bool ringing) {
+        QTimer::singleShot(0, this, [this, ringing] { onIncomingCallChanged(ringing); });
+    });
+    connect(phone(), &Mavrosk::PhoneSource::newTextMessageAlert, this,
+            [this] { QTimer::singleShot(0, this, &SimulatedPhone::onNewTextMessage); });
+
+    const int firstNames = int(std::size(FirstNames));
+    for (int i = 0; i < ContactCount; ++i) {
+        Entry contact;
+        contact.name = QStringLiteral("%1 %2").arg(
+                QLatin1String(FirstNames[i % firstNames]),
+                QLatin1String(Surnames[(i / firstNames + i * 3) % int(std::size(Surnames))]));
+        contact.number = fictionalNumber(i);
+        m_contacts.append(contact);
+    }
+    std::sort(m_contacts.begin(), m_contacts.end(),
+              [](const Entry &a, const Entry &b) { return a.name < b.name; });
+    for (int i = 0; i < RecentCallCount; ++i) {
+        // Every seventh call is from a number not in the contacts.
+        Entry call = i % 7 == 6
+                ? Entry{QString(), fictionalNumber(ContactCount + i), {}, 0, {}, true}
+                : m_contacts.at((i * 5) % ContactCount);
+        call.type = CallTypes[i % int(std::size(CallTypes))];
+        call.time = Morning.addSecs(-60LL * (i * 97 + 13));
+        m_calls.append(call);
+    }
+    for (int i = 0; i < MessageCount; ++i) {
+        Entry message = m_contacts.at((i * 7 + 3) % ContactCount);
+        message.text = QLatin1String(Texts[i % int(std::size(Texts))]);
+        message.time = Morning.addSecs(-60LL * (i * 131 + 5));
+        message.read = i >= 3;
+        m_messages.append(message);
+    }
 }
 
 SimulatedPhone::~SimulatedPhone() = default;
@@ -59,11 +153,18 @@ void SimulatedPhone::connectPhone()
     // The phone has answered the request for message access, and its messages are in memory.
     setPhone("smsPhoneDeclinedAccessStatus", true);
     setPhone("messagesInMemoryStatus", true);
-    setPhone("recentCallListStatus", 1);
+    QVariantList replies;
+    for (const char *reply : Replies)
+        replies.append(QVariantMap{{QStringLiteral("text"), QLatin1String(reply)}});
+    setPhone("smsReplyMessages", replies);
+    setPhone("recentCallListStatus", RecentCallsAvailable);
     contactsDownloaded();
-    setPhone("messagesInboxEmptyStatus", false);
-    setPhone("smsTotalCount", 3);
-    setPhone("messagesDownloadingStatus", 3);
+    messagesDownloaded();
+}
+
+QDateTime SimulatedPhone::now() const
+{
+    return Morning.addMSecs(m_clock ? m_clock->now() : 0);
 }
 
 void SimulatedPhone::onJournalEntry(const Platform::JournalEntry &entry)
@@ -95,6 +196,8 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
 
     if (command == QLatin1String("acceptIncomingCall")) {
         const bool second = p->callConnected();
+        m_answered = true;
+        logCall(caller(m_nextCaller), Received);
         setPhone("incomingCall", false);
         setPhone("callConnected", true);
         setPhone("multipleCallsConnected", second);
@@ -110,7 +213,10 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     } else if (command == QLatin1String("dialNumber")) {
         dial(args.value(0).toString());
     } else if (command == QLatin1String("dialRecentCall")) {
-        dial(QStringLiteral("recent"));
+        // The row of the list the head unit shows, of the type it was downloaded with.
+        const int index = args.value(1).toInt();
+        dial(index >= 0 && index < m_downloadedCalls.size() ? m_downloadedCalls.at(index).number
+                                                            : QString());
     } else if (command == QLatin1String("joinCalls")) {
         if (p->status() == TwoCalls)
             setPhone("status", TwoCallsJoined);
@@ -127,25 +233,34 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
                || command == QLatin1String("retryPhnBookDownloadAccess")
                || command == QLatin1String("reDownloadContacts")) {
         downloadContacts();
-    } else if (command == QLatin1String("resetPhoneBook")
-               || command == QLatin1String("deleteAllContacts")) {
-        p->phoneBook()->setListLength(0);
-        p->AlphabetIndexModel()->setRows({});
-        setPhone("phoneBookStatus", 3);
+    } else if (command == QLatin1String("deleteAllContacts")) {
+        deleteContacts();
+    } else if (command == QLatin1String("searchPhoneBook")) {
+        QTimer::singleShot(SearchDelay, this, [] { emit phone()->phonebookSearchReady(); });
+    } else if (command == QLatin1String("selectPhoneBookEntry")) {
+        const int index = args.value(0).toInt();
+        if (index >= 0 && index < p->phoneBook()->listLength())
+            emit p->phonebookContactDetailsReady();
     } else if (command == QLatin1String("downloadRecentCallsList")) {
-        setPhone("recentCallListStatus", 3);
-        QTimer::singleShot(RecentCallsDownloadDelay, this,
-                           [] { setPhone("recentCallListStatus", 1); });
+        // Without a type, the list of the type the head unit shows.
+        downloadRecentCalls(args.isEmpty() ? p->currentRecentCallListType()
+                                           : args.value(0).toInt());
     } else if (command == QLatin1String("requestTextMessagesInbox")
                || command == QLatin1String("retrySmsDownload")
                || command == QLatin1String("retryMessageProfileAccess")) {
         downloadMessages();
+    } else if (command == QLatin1String("requestSelectedTextMessageDetails")) {
+        showMessage(args.value(0).toInt(), false);
+    } else if (command == QLatin1String("requestNewTextMessageDetails")) {
+        showMessage(0, true);
     } else if (command == QLatin1String("initiateSendTextMessage")) {
         // A status of its own while the message goes, so that every send reports its outcome
         // as a change.
         setPhone("sendMessageStatus", SendingMessage);
         QTimer::singleShot(SendMessageDelay, this, [] { setPhone("sendMessageStatus", 2); });
     }
+    // resetPhoneBook() puts the phone's view of its phone book back to the start of the list,
+    // and exitingPhoneBook() closes it: the list itself stays as it is.
 }
 
 void SimulatedPhone::dial(const QString &number)
@@ -155,6 +270,12 @@ void SimulatedPhone::dial(const QString &number)
         emit phone()->phoneDialingFailed(1);
         return;
     }
+    Entry called{QString(), number, {}, 0, {}, true};
+    for (const Entry &contact : qAsConst(m_contacts)) {
+        if (contact.number == number)
+            called = contact;
+    }
+    logCall(called, Dialled);
     setPhone("dialingInProgress", true);
     setPhone("status", Dialling);
     m_dialTimer->start();
@@ -177,32 +298,166 @@ void SimulatedPhone::callEnded()
     setPhone("status", NoCall);
 }
 
+void SimulatedPhone::onIncomingCallChanged(bool ringing)
+{
+    if (ringing == m_ringing || ringing != phone()->incomingCall())
+        return;
+    m_ringing = ringing;
+    if (ringing) {
+        m_answered = false;
+        return;
+    }
+    // The ringing stopped without an answer: a missed call, from the one who rang.
+    if (!m_answered)
+        logCall(caller(m_nextCaller), Missed);
+    ++m_nextCaller;
+}
+
+SimulatedPhone::Entry SimulatedPhone::caller(int index) const
+{
+    return m_contacts.at((index * 11 + 2) % m_contacts.size());
+}
+
+void SimulatedPhone::logCall(const Entry &caller, int type)
+{
+    Entry call = caller;
+    call.type = type;
+    call.time = now();
+    m_calls.prepend(call);
+    while (m_calls.size() > RecentCallMemory)
+        m_calls.removeLast();
+    // The list changed: the head unit may download it again.
+    if (phone()->recentCallListStatus() == RecentCallsDownloaded)
+        setPhone("recentCallListStatus", RecentCallsAvailable);
+}
+
+void SimulatedPhone::onNewTextMessage()
+{
+    // The text the phone's side gave the message, unless it is the last one the phone showed.
+    const QString body = phone()->textMessageBody();
+    Entry message = m_contacts.at((m_messages.size() * 7 + 3) % m_contacts.size());
+    message.text = !body.isEmpty() && (m_messages.isEmpty() || body != m_messages.first().text)
+            ? body
+            : QLatin1String(Texts[m_messages.size() % int(std::size(Texts))]);
+    message.time = now();
+    message.read = false;
+    m_messages.prepend(message);
+    setPhone("messagesInboxEmptyStatus", false);
+    setPhone("smsTotalCount", m_messages.size());
+    setPhone("totalUnreadSmsCount", phone()->totalUnreadSmsCount() + 1);
+}
+
+void SimulatedPhone::showMessage(int index, bool fromAlert)
+{
+    // A selection is a row of the inbox the head unit holds; an alert is the newest message.
+    if (fromAlert) {
+        setPhone("textMessageBody", m_messages.isEmpty() ? QString() : m_messages.first().text);
+        emit phone()->newTextMessageDetailsReady();
+        return;
+    }
+    if (index < 0 || index >= m_downloadedMessages.size())
+        return;
+    Entry &shown = m_downloadedMessages[index];
+    if (!shown.read) {
+        // Opened on the head unit, the message is read on the phone too.
+        for (Entry &message : m_messages) {
+            if (message.time == shown.time && message.number == shown.number)
+                message.read = true;
+        }
+        shown.read = true;
+        phone()->textMessageList()->setRows(messageRows(m_downloadedMessages));
+        setPhone("totalUnreadSmsCount", qMax(0, phone()->totalUnreadSmsCount() - 1));
+    }
+    setPhone("textMessageBody", shown.text);
+    emit phone()->textMessageDetailsReady();
+}
+
 void SimulatedPhone::downloadContacts()
 {
-    setPhone("phoneBookStatus", 2);
+    setPhone("phoneBookStatus", ContactsDownloading);
     later(ContactsDownloadDelay, &SimulatedPhone::contactsDownloaded);
 }
 
 void SimulatedPhone::contactsDownloaded()
 {
+    QVariantList rows;
+    for (const Entry &contact : qAsConst(m_contacts))
+        rows.append(QVariantMap{{QStringLiteral("name"), contact.name},
+                                {QStringLiteral("number"), contact.number}});
+    // One entry per letter; a letter without contacts starts at no row.
     QVariantList letters;
-    const int perLetter = ContactCount / 20;
-    for (int i = 0; i < 20; ++i)
-        letters.append(QVariantMap{{QStringLiteral("alphabet"), QString(QLatin1Char('A' + i))},
-                                   {QStringLiteral("letterIndex"), i * perLetter}});
+    for (char letter = 'A'; letter <= 'Z'; ++letter) {
+        int start = -1;
+        for (int row = 0; row < m_contacts.size() && start < 0; ++row) {
+            if (m_contacts.at(row).name.startsWith(QLatin1Char(letter)))
+                start = row;
+        }
+        letters.append(QVariantMap{{QStringLiteral("alphabet"), QString(QLatin1Char(letter))},
+                                   {QStringLiteral("letterIndex"), start}});
+    }
     phone()->AlphabetIndexModel()->setRows(letters);
-    phone()->phoneBook()->setListLength(ContactCount);
-    setPhone("phoneBookStatus", 1);
+    phone()->phoneBook()->setRows(rows);
+    phone()->phoneBook()->setListLength(rows.size());
+    setPhone("phoneBookStatus", ContactsDownloaded);
+}
+
+void SimulatedPhone::deleteContacts()
+{
+    // The head unit's copy goes; the phone keeps its own until it is downloaded again.
+    phone()->phoneBook()->setRows({});
+    phone()->phoneBook()->setListLength(0);
+    phone()->AlphabetIndexModel()->setRows({});
+    setPhone("phoneBookStatus", ContactsEmpty);
+}
+
+void SimulatedPhone::downloadRecentCalls(int type)
+{
+    setPhone("recentCallListStatus", RecentCallsDownloading);
+    QTimer::singleShot(RecentCallsDownloadDelay, this, [this, type] {
+        m_downloadedCalls.clear();
+        QVariantList rows;
+        for (const Entry &call : qAsConst(m_calls)) {
+            if (type != 0 && call.type != type)
+                continue;
+            m_downloadedCalls.append(call);
+            rows.append(QVariantMap{{QStringLiteral("name"), call.name},
+                                    {QStringLiteral("number"), call.number},
+                                    {QStringLiteral("type"), call.type},
+                                    {QStringLiteral("time"), timeText(call.time)}});
+        }
+        phone()->recentCallList()->setRows(rows);
+        setPhone("recentCallListStatus", RecentCallsDownloaded);
+    });
 }
 
 void SimulatedPhone::downloadMessages()
 {
-    setPhone("messagesDownloadingStatus", 2);
-    QTimer::singleShot(MessagesDownloadDelay, this, [] {
-        setPhone("messagesInboxEmptyStatus", false);
-        setPhone("smsTotalCount", 3);
-        setPhone("messagesDownloadingStatus", 3);
-    });
+    setPhone("messagesDownloadingStatus", MessagesRunning);
+    later(MessagesDownloadDelay, &SimulatedPhone::messagesDownloaded);
+}
+
+QVariantList SimulatedPhone::messageRows(const QList<Entry> &messages)
+{
+    QVariantList rows;
+    for (const Entry &message : messages)
+        rows.append(QVariantMap{{QStringLiteral("name"), message.name},
+                                {QStringLiteral("number"), message.number},
+                                {QStringLiteral("time"), timeText(message.time)},
+                                {QStringLiteral("text"), message.text},
+                                {QStringLiteral("read"), message.read}});
+    return rows;
+}
+
+void SimulatedPhone::messagesDownloaded()
+{
+    m_downloadedMessages = m_messages;
+    const int unread = int(std::count_if(m_messages.begin(), m_messages.end(),
+                                         [](const Entry &message) { return !message.read; }));
+    phone()->textMessageList()->setRows(messageRows(m_messages));
+    setPhone("messagesInboxEmptyStatus", m_messages.isEmpty());
+    setPhone("smsTotalCount", m_messages.size());
+    setPhone("totalUnreadSmsCount", unread);
+    setPhone("messagesDownloadingStatus", MessagesFinished);
 }
 
 } // namespace Simulator

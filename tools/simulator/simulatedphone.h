@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QDateTime>
+#include <QList>
 #include <QObject>
 #include <QString>
 #include <QVariantList>
@@ -12,19 +14,30 @@ struct JournalEntry;
 
 namespace Simulator {
 
+class VirtualEventDispatcher;
+
 // A plausible paired phone: it answers the module's bridge commands the way a phone does, later
 // and through the bridge's values and signals (accepting a call connects it, ending it drops the
-// status to 0, dialling goes through 3 to 7 after a second, contacts, recent calls and messages
-// download after a delay). Its delays run on the virtual clock.
+// status to 0, dialling goes through 3 to 7 after a second). It keeps a phone book, recent calls
+// and text messages, and hands them to the head unit when asked, with the statuses in the order a
+// phone reports them:
+//   - contacts: 2 (downloading), then the list and its alphabet bar, then 1 (downloaded);
+//     resetting the phone book's view keeps the list; deleting the contacts leaves 3 (empty);
+//   - recent calls: 1 (a list to download); asked for it, 3 (downloading), then the list of the
+//     type asked for and 2 (downloaded); a new call makes it 1 again;
+//   - messages: 2 (running), then the inbox and its counts, then 3 (finished).
+// Calls and text messages that come and go are added to its lists. Its delays run on the virtual
+// clock, and its times are those of a fixed morning moved on by the clock.
 class SimulatedPhone : public QObject
 {
     Q_OBJECT
 public:
-    explicit SimulatedPhone(QObject *parent = nullptr);
+    explicit SimulatedPhone(VirtualEventDispatcher *clock = nullptr, QObject *parent = nullptr);
     ~SimulatedPhone() override;
 
-    // A phone that is paired and connected, with its contacts, recent calls and messages already
-    // downloaded: the values a head unit has a while after the phone connected.
+    // A phone that is paired and connected, with its contacts and messages already downloaded
+    // and its recent calls ready to download: the values a head unit has a while after the phone
+    // connected.
     void connectPhone();
 
     static constexpr int DialConnectDelay = 1000;
@@ -32,20 +45,54 @@ public:
     static constexpr int RecentCallsDownloadDelay = 1500;
     static constexpr int MessagesDownloadDelay = 2000;
     static constexpr int SendMessageDelay = 1000;
-    static constexpr int ContactCount = 120;
+    static constexpr int SearchDelay = 300;
+    static constexpr int ContactCount = 48;
+    static constexpr int RecentCallCount = 30;
+    static constexpr int MessageCount = 24;
+    // A phone keeps this many recent calls; the oldest go.
+    static constexpr int RecentCallMemory = 50;
 
 private:
+    struct Entry
+    {
+        QString name; // empty: a number not in the contacts
+        QString number;
+        QDateTime time;
+        int type = 0; // recent calls: 1 missed, 2 received, 3 dialled
+        QString text; // text messages
+        bool read = true;
+    };
+
     void onJournalEntry(const Platform::JournalEntry &entry);
     void answer(const QString &call, const QVariantList &args);
     void dial(const QString &number);
     void callConnected();
     void callEnded();
+    void onIncomingCallChanged(bool ringing);
+    void onNewTextMessage();
+    void logCall(const Entry &caller, int type);
     void downloadContacts();
     void contactsDownloaded();
+    void deleteContacts();
+    void downloadRecentCalls(int type);
     void downloadMessages();
+    void messagesDownloaded();
+    static QVariantList messageRows(const QList<Entry> &messages);
+    void showMessage(int index, bool fromAlert);
     void later(int delay, void (SimulatedPhone::*reaction)());
+    QDateTime now() const;
+    Entry caller(int index) const;
 
+    VirtualEventDispatcher *m_clock;
     QTimer *m_dialTimer;
+    QList<Entry> m_contacts; // by name
+    QList<Entry> m_calls; // newest first
+    QList<Entry> m_messages; // newest first
+    QList<Entry> m_downloadedCalls; // the list the head unit has, of the type it asked for
+    QList<Entry> m_downloadedMessages; // the inbox the head unit has
+    bool m_ringing = false;
+    bool m_answered = false;
+    int m_nextCaller = 0;
 };
 
 } // namespace Simulator

@@ -101,7 +101,7 @@ HmiPhoneIntegration::moduleRootHierarchyPopupStates() const
 
 void HmiPhoneIntegration::registerTypes()
 {
-    qCDebug(hmiphone) << Q_FUNC_INFO;
+    qCDebug(hmiphone, "Registering the phone's QML types");
     registerUncreatable<HmiPhoneIntegration>("HmiPhoneIntegration");
     registerUncreatable<HmiPhoneController>("HmiPhoneController");
     registerUncreatable<Mavrosk::PhoneSource>("PhoneSource");
@@ -112,7 +112,7 @@ void HmiPhoneIntegration::registerTypes()
 
 Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiState *parent)
 {
-    qCDebug(hmiphone) << Q_FUNC_INFO;
+    qCDebug(hmiphone, "Building the phone's screens and global popups");
     if (!m_controller) {
         qCWarning(hmiphone) << "HmiPhoneIntegration: the controller is gone, no phone states built";
         return nullptr;
@@ -137,7 +137,7 @@ Quorvel::HmiState *HmiPhoneIntegration::createScreenStateSubTree(Quorvel::HmiSta
 
 void HmiPhoneIntegration::exportObjects(QQmlContext *context)
 {
-    qCDebug(hmiphone) << Q_FUNC_INFO;
+    qCDebug(hmiphone, "Exporting _hmiphone and _hmiphoneController to QML");
     context->setContextProperty(QStringLiteral("_hmiphone"), this);
     context->setContextProperty(QStringLiteral("_hmiphoneController"), m_controller);
 }

@@ -1,5 +1,6 @@
 #include "headunitwindow.h"
 
+#include "carkeys.h"
 #include "headunitscreen.h"
 #include "outputwriter.h"
 
@@ -69,6 +70,7 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
     context->setContextProperty(QStringLiteral("_headUnit"), m_screen);
     context->setContextProperty(QStringLiteral("_scenario"), m_player);
     context->setContextProperty(QStringLiteral("_trace"), m_trace);
+    context->setContextProperty(QStringLiteral("_carKeys"), carKeysForQml());
 
     const QUrl main(QStringLiteral("qrc:/hmiphone-sim/Main.qml"));
     if (mode == OnScreen) {

@@ -51,15 +51,11 @@ Rectangle {
         Grid {
             columns: 4
             spacing: 10
-            Key { code: 12; text: "Phone" }
-            Key { code: 49; text: "Send" }
-            Key { code: 50; text: "End" }
-            Key { code: 77; text: "Accept/\u25C0" }
-            Key { code: 78; text: "Reject/\u25B6" }
-            Key { code: 79; text: "Send 2" }
-            Key { code: 80; text: "End 2" }
-            Key { code: 90; text: "Wheel \u25BC" }
-            Key { code: 91; text: "Wheel \u25B2" }
+            // The simulator's table of the car's keys.
+            Repeater {
+                model: _carKeys
+                Key { code: modelData.code; text: modelData.label }
+            }
         }
 
         Heading { text: "Menu bar" }

@@ -21,10 +21,10 @@ Page {
         width: parent.width
         height: parent.height - 96
         clip: true
-        model: phone.smsTotalCount
+        model: phone.textMessageList()
         delegate: ListRow {
             width: ListView.view.width
-            text: "Message " + (index + 1)
+            text: (model.read ? "" : "\u2022 ") + (model.name || model.number) + ": " + model.text
             detail: "hear"
             onClicked: _hmiphoneController.viewTextMessageOptions(index)
             MouseArea {

@@ -1,7 +1,7 @@
 import QtQuick 2.15
 import ".."
 
-// The recent calls: the list types, and the entries the phone lists, dialled by type and row.
+// The recent calls: the list types, and the list the phone last sent, dialled by type and row.
 Page {
     id: page
     readonly property var phone: _hmiphoneController.phoneSource
@@ -25,11 +25,11 @@ Page {
         width: parent.width
         height: parent.height - 96
         clip: true
-        model: phone.recentCallListStatus === 1 ? 5 : 0
+        model: phone.recentCallList()
         delegate: ListRow {
             width: ListView.view.width
-            text: "Entry " + (index + 1)
-            detail: "dial"
+            text: model.name || model.number
+            detail: model.time
             onClicked: _hmiphoneController.dialRecentCall(page.type, index)
         }
     }
