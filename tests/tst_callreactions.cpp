@@ -93,8 +93,7 @@ void TestCallReactions::incomingCall()
         GlobalHmi::post(screen);
 
     const qint64 since = GlobalHmi::mark();
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
     QCOMPARE(GlobalHmi::isOpen(QStringLiteral("IncomingCall")),
              outputs.endsWith(QStringLiteral("popup-request IncomingCall")));
@@ -130,8 +129,7 @@ void TestCallReactions::answer()
     QFETCH(QString, event);
     QFETCH(Outputs, outputs);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QVERIFY(GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 
     qint64 since = GlobalHmi::mark();
@@ -148,8 +146,7 @@ void TestCallReactions::waitingCall()
     phone()->setStatus(7);
     phone()->setCallConnected(true);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QVERIFY(GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 
     // Accepted once: a second accept finds nothing ringing.
@@ -160,18 +157,15 @@ void TestCallReactions::waitingCall()
              Outputs{QStringLiteral("bridge phone.acceptIncomingCall")});
 
     // The phone fails to take it: the waiting-call popup gives way to the failure.
-    emit phone()->phoneCallAcceptingFailed();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!phoneCallAcceptingFailed"_q);
     QVERIFY(GlobalHmi::isOpen(QStringLiteral("CallAnswerNotResponding")));
     QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 
     // A further waiting call whose caller hangs up.
     phone()->setIncomingCall(false);
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QVERIFY(GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
-    emit phone()->phoneWaitingCallRemoteRejection();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!phoneWaitingCallRemoteRejection"_q);
     QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 }
 
@@ -193,18 +187,14 @@ void TestCallReactions::ringingEnds()
     QFETCH(bool, connectionFirst);
     phone()->setCallConnected(duringCall);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QVERIFY(GlobalHmi::isOpen(duringCall ? QStringLiteral("WaitingCall")
                                          : QStringLiteral("IncomingCall")));
 
-    for (const bool connectionNow : {connectionFirst, !connectionFirst}) {
-        if (connectionNow)
-            phone()->setCallConnected(!duringCall);
-        else
-            phone()->setIncomingCall(false);
-        TestSupport::processUntilIdle();
-    }
+    for (const bool connectionNow : {connectionFirst, !connectionFirst})
+        m_hmi->apply(connectionNow ? QStringLiteral("phone.callConnected=")
+                                     + QLatin1String(duringCall ? "false" : "true")
+                                   : "phone.incomingCall=false"_q);
     QVERIFY(!GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
     QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 }
@@ -237,8 +227,7 @@ void TestCallReactions::missedCall()
     QVERIFY(m_hmi->run());
 
     const qint64 since = GlobalHmi::mark();
-    emit phone()->missedCallsPresent();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!missedCallsPresent"_q);
     const Outputs missed{QStringLiteral("popup-dismiss IncomingCall"),
                          QStringLiteral("popup-request MissedCallPopup")};
     QCOMPARE(GlobalHmi::outputsSince(since), popup ? missed : Outputs());
@@ -286,8 +275,7 @@ void TestCallReactions::dialingFailures()
 
     // A call getting through clears a failure still shown.
     phone()->setStatus(3);
-    phone()->setStatus(7);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.status=7"_q);
     QVERIFY(!GlobalHmi::isOpen(QStringLiteral("DialingFailed")));
 }
 
@@ -316,8 +304,7 @@ void TestCallReactions::callEnded()
     QVERIFY(m_hmi->run());
 
     const qint64 since = GlobalHmi::mark();
-    emit phone()->multipartyActiveCallEnded();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!multipartyActiveCallEnded"_q);
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
 
     // Confirming closes the popup; a confirmation without the popup does nothing.
@@ -358,8 +345,7 @@ void TestCallReactions::roamingConfirmation()
 void TestCallReactions::incomingCallRoadThroughThePlugin()
 {
     QVERIFY(m_hmi->run(QStringLiteral(HMIPHONE_PLUGIN_FILE)));
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QVERIFY(GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 
     QObject *controller = nullptr;
@@ -380,15 +366,13 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
 
     phone()->setCallConnected(true);
     phone()->setIncomingCall(false);
-    phone()->setStatus(7);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.status=7"_q);
     QCOMPARE(Brisken::ViewController::instance()->activeView(),
              QStringLiteral("PHONE.CallInProgress"));
 
     since = GlobalHmi::mark();
     phone()->setCallConnected(false);
-    phone()->setStatus(0);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.status=0"_q);
     QCOMPARE(TestSupport::journalValues(QStringLiteral("back"), QStringLiteral("steps"), since),
              QStringList{QStringLiteral("1")});
     QCOMPARE(Brisken::ViewController::instance()->activeView(), QStringLiteral("HOST.Home"));
@@ -458,6 +442,7 @@ void TestCallReactions::keys_data()
     const Outputs endCall{out("bridge phone.endCall")};
     const Outputs swapCall{out("bridge phone.swapCall")};
 
+    // clang-format off
     row("idle: phone key opens the phone", Idle, 0, 12, 2, phoneMenu);
     row("idle: phone key press", Idle, 0, 12, 1, {});
     row("idle: phone key long", Idle, 0, 12, 3, {});
@@ -480,8 +465,7 @@ void TestCallReactions::keys_data()
     row("idle, projection: 91 release", Idle, Projection, 91, 4, {});
     for (const auto &[key, kind] :
          {std::pair{78, 1}, {50, 1}, {80, 1}, {90, 2}, {91, 2}, {90, 3}, {90, 4}, {91, 3}})
-        QTest::addRow("idle, projection: %d/%d", key, kind)
-                << int(Idle) << int(Projection) << key << kind << Outputs();
+        QTest::addRow("idle, projection: %d/%d", key, kind) << int(Idle) << int(Projection) << key << kind << Outputs();
     row("two calls, projection: send 79", TwoCalls, Projection, 79, 1, {});
     row("idle, blocked: 77", Idle, Blocked, 77, 1, {});
     row("idle, blocked: end", Idle, Blocked, 50, 1, {});
@@ -503,19 +487,14 @@ void TestCallReactions::keys_data()
     row("ringing, do not disturb: phone key", Ringing, DoNotDisturb, 12, 2, {});
     // Under do-not-disturb the call was refused at once: the call keys do what they do without
     // a ringing call, though the phone still reports it.
-    row("ringing, do not disturb: 77 seeks", Ringing, DoNotDisturb, 77, 1,
-        hardKey("processCombinedSeekLeftKey"));
-    row("ringing, do not disturb: 78 seeks", Ringing, DoNotDisturb, 78, 1,
-        hardKey("processCombinedSeekRightKey"));
+    row("ringing, do not disturb: 77 seeks", Ringing, DoNotDisturb, 77, 1, hardKey("processCombinedSeekLeftKey"));
+    row("ringing, do not disturb: 78 seeks", Ringing, DoNotDisturb, 78, 1, hardKey("processCombinedSeekRightKey"));
     row("ringing, do not disturb: send", Ringing, DoNotDisturb, 49, 1, {});
     row("ringing, do not disturb: send 79", Ringing, DoNotDisturb, 79, 1, {});
     row("ringing, do not disturb: end", Ringing, DoNotDisturb, 50, 1, phoneSection);
-    row("ringing, do not disturb: 90 seeks", Ringing, DoNotDisturb, 90, 2,
-        hardKey("processSWCSeekDownShortPress"));
-    row("ringing, do not disturb: 91 seeks", Ringing, DoNotDisturb, 91, 2,
-        hardKey("processSWCSeekUpShortPress"));
-    row("ringing, switched to do not disturb: 90 seeks", Ringing, DoNotDisturbLater, 90, 2,
-        hardKey("processSWCSeekDownShortPress"));
+    row("ringing, do not disturb: 90 seeks", Ringing, DoNotDisturb, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("ringing, do not disturb: 91 seeks", Ringing, DoNotDisturb, 91, 2, hardKey("processSWCSeekUpShortPress"));
+    row("ringing, switched to do not disturb: 90 seeks", Ringing, DoNotDisturbLater, 90, 2, hardKey("processSWCSeekDownShortPress"));
     row("ringing, switched to do not disturb: 80", Ringing, DoNotDisturbLater, 80, 1, phoneSection);
     row("waiting, do not disturb: 77", Waiting, DoNotDisturb, 77, 1, {});
     row("waiting, do not disturb: 78 ends the call", Waiting, DoNotDisturb, 78, 1, endCall);
@@ -556,14 +535,10 @@ void TestCallReactions::keys_data()
     row("one call, private: 77", OneCall, Private, 77, 1, hardKey("processCombinedSeekLeftKey"));
     row("one call, private: 78", OneCall, Private, 78, 1, hardKey("processCombinedSeekRightKey"));
     row("one call, private: end", OneCall, Private, 80, 1, {});
-    row("one call, private: 90 short", OneCall, Private, 90, 2,
-        hardKey("processSWCSeekDownShortPress"));
-    row("one call, private: 91 long", OneCall, Private, 91, 3,
-        hardKey("processSWCSeekUpLongPress"));
-    row("one call, private: 91 short", OneCall, Private, 91, 2,
-        hardKey("processSWCSeekUpShortPress"));
-    row("one call, private: 90 release", OneCall, Private, 90, 4,
-        hardKey("processSWCSeekDownLongRelease"));
+    row("one call, private: 90 short", OneCall, Private, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("one call, private: 91 long", OneCall, Private, 91, 3, hardKey("processSWCSeekUpLongPress"));
+    row("one call, private: 91 short", OneCall, Private, 91, 2, hardKey("processSWCSeekUpShortPress"));
+    row("one call, private: 90 release", OneCall, Private, 90, 4, hardKey("processSWCSeekDownLongRelease"));
     row("one call, blocked: phone key long", OneCall, Blocked, 12, 3, {});
     row("one call, blocked: 78", OneCall, Blocked, 78, 1, {});
     row("one call, blocked: 91 long", OneCall, Blocked, 91, 3, endCall);
@@ -592,6 +567,7 @@ void TestCallReactions::keys_data()
     row("status 11: 91 release", Status11, 0, 91, 4, {});
     row("status 12: 90 long", Status12, 0, 90, 3, hardKey("processSWCSeekDownLongPress"));
     row("status 12: 91 release", Status12, 0, 91, 4, hardKey("processSWCSeekUpLongRelease"));
+    // clang-format on
 }
 
 void TestCallReactions::keys()
@@ -614,14 +590,12 @@ void TestCallReactions::keys()
     Mavrosk::ProjectionSource::instance()->setIsRendering(conditions & Rendering);
     QVERIFY(m_hmi->run());
     if (situation == Ringing || situation == Waiting) {
-        phone()->setIncomingCall(true);
-        TestSupport::processUntilIdle();
+        m_hmi->apply("phone.incomingCall=true"_q);
     }
     if (conditions & DoNotDisturbLater)
         m_hmi->apply(QStringLiteral("phone.doNotDisturb=true"));
     if (conditions & Covered) {
-        emit phone()->phoneRoamingModeReceived();
-        TestSupport::processUntilIdle();
+        m_hmi->apply("phone!phoneRoamingModeReceived"_q);
         QVERIFY(GlobalHmi::isOpen(QStringLiteral("RoamingWarning")));
     }
 
