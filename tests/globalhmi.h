@@ -100,9 +100,10 @@ public:
         TestSupport::processUntilIdle();
     }
 
-    static bool shown(const QString &view)
+    // Open, on top or covered: a popup left open under another is not closed.
+    static bool isOpen(const QString &view)
     {
-        const QStringList popups = Brisken::ViewController::instance()->shownPopups();
+        const QStringList popups = Brisken::ViewController::instance()->openPopups();
         return popups.contains(QStringLiteral("PHONE.") + view);
     }
 

@@ -87,9 +87,23 @@ inline QStringList journalValues(const QString &kind, const QString &field = QSt
     return values;
 }
 
+// An intent request's flags and extra value, only those set: " flag", " voice", " extra=x".
+inline QString intentFlags(const QVariantMap &fields)
+{
+    QString flags;
+    if (fields.value(QStringLiteral("flag")).toBool())
+        flags += QStringLiteral(" flag");
+    if (fields.value(QStringLiteral("fromVoice")).toBool())
+        flags += QStringLiteral(" voice");
+    if (fields.value(QStringLiteral("extra")).isValid())
+        flags += QStringLiteral(" extra=") + fields.value(QStringLiteral("extra")).toString();
+    return flags;
+}
+
 // The journal since `since` in order, one line per entry of the `kinds` given (all when empty):
-// bridge commands as "phone.dialNumber(555)", intents as "intent 20(a,b)", the others as
-// "kind name-or-id-or-steps", e.g. "event HmiPhone_RoamingMode", "popup-request PHONE.Redial".
+// bridge commands as "phone.dialNumber(555)", intents as "intent 20(a,b)" with their flags, the
+// others as "kind name-or-id-or-steps", e.g. "event HmiPhone_RoamingMode", "popup-request
+// PHONE.Redial".
 inline QStringList journalLines(qint64 since, const QStringList &kinds = {})
 {
     QStringList lines;
@@ -105,7 +119,7 @@ inline QStringList journalLines(qint64 since, const QStringList &kinds = {})
             lines.append(f.value(QStringLiteral("call")).toString() + argList);
         else if (entry.kind == QLatin1String("intent"))
             lines.append(QStringLiteral("intent ") + f.value(QStringLiteral("action")).toString()
-                         + argList);
+                         + argList + intentFlags(f));
         else
             for (const char *field : {"name", "id", "steps", "call"})
                 if (f.contains(QLatin1String(field))) {

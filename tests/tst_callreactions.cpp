@@ -48,19 +48,31 @@ void TestCallReactions::incomingCall_data()
     QTest::addColumn<int>("status");
     QTest::addColumn<bool>("twoCalls");
     QTest::addColumn<bool>("readingAloud");
+    QTest::addColumn<QString>("screen"); // an event posted before the call: the screen shown
     QTest::addColumn<Outputs>("outputs");
 
     const QString incoming = QStringLiteral("popup-request IncomingCall");
     const QString reject = QStringLiteral("bridge phone.rejectIncomingCall");
-    QTest::addRow("idle") << false << 0 << false << false << Outputs{incoming};
+    const QString home;
+    QTest::addRow("idle") << false << 0 << false << false << home << Outputs{incoming};
     QTest::addRow("message read aloud")
-            << false << 0 << false << true
+            << false << 0 << false << true << home
             << Outputs{QStringLiteral("bridge phone.stopTextMessagePlayback"), incoming};
     QTest::addRow("during a call, message read aloud")
-            << false << 7 << false << true << Outputs{QStringLiteral("popup-request WaitingCall")};
-    QTest::addRow("two calls connected") << false << 9 << true << false << Outputs{reject};
-    QTest::addRow("status 11") << false << 11 << false << false << Outputs{reject};
-    QTest::addRow("do not disturb") << true << 0 << false << false << Outputs();
+            << false << 7 << false << true << home
+            << Outputs{QStringLiteral("popup-request WaitingCall")};
+    QTest::addRow("two calls connected") << false << 9 << true << false << home << Outputs{reject};
+    QTest::addRow("status 11") << false << 11 << false << false << home << Outputs{reject};
+    // Under do-not-disturb the call is refused at once, whatever is on screen.
+    const char *const screens[][2] = {{"home", ""},
+                                      {"phone menu", "HmiPhone_RootStateRequest"},
+                                      {"contacts", "HmiPhone_ShowContactsRequest"},
+                                      {"status alerts", "HmiPhone_ShowStatusBarAlertsRequest"}};
+    for (const auto &screen : screens)
+        QTest::addRow("do not disturb, %s", screen[0])
+                << true << 0 << false << false << QString::fromLatin1(screen[1]) << Outputs{reject};
+    QTest::addRow("do not disturb, call screen")
+            << true << 7 << false << false << home << Outputs{reject};
 }
 
 void TestCallReactions::incomingCall()
@@ -69,6 +81,7 @@ void TestCallReactions::incomingCall()
     QFETCH(int, status);
     QFETCH(bool, twoCalls);
     QFETCH(bool, readingAloud);
+    QFETCH(QString, screen);
     QFETCH(Outputs, outputs);
     phone()->setDoNotDisturb(doNotDisturb);
     phone()->setStatus(status);
@@ -76,13 +89,16 @@ void TestCallReactions::incomingCall()
     phone()->setMultipleCallsConnected(twoCalls);
     Mavrosk::SpeechSource::instance()->setTtsSessionActive(readingAloud);
     QVERIFY(m_hmi->run());
+    if (!screen.isEmpty())
+        GlobalHmi::post(screen);
 
     const qint64 since = GlobalHmi::mark();
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.incomingCall=true"_q);
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
-    QCOMPARE(GlobalHmi::shown(QStringLiteral("IncomingCall")),
+    QCOMPARE(GlobalHmi::isOpen(QStringLiteral("IncomingCall")),
              outputs.endsWith(QStringLiteral("popup-request IncomingCall")));
+    QCOMPARE(GlobalHmi::isOpen(QStringLiteral("WaitingCall")),
+             outputs.endsWith(QStringLiteral("popup-request WaitingCall")));
 }
 
 void TestCallReactions::answer_data()
@@ -98,7 +114,14 @@ void TestCallReactions::answer_data()
                            QStringLiteral("bridge phone.rejectIncomingCall"),
                            QStringLiteral("transient PhoneRejectedIncomingCall")};
     QTest::addRow("rejected") << QString(Events::HmiPhone_RejectIncomingCall) << rejected;
-    QTest::addRow("caller hung up") << QString() << rejected;
+    QTest::addRow("caller hung up") << "phone!phoneIncomingCallRemoteRejection"_q << rejected;
+    // Switched on while the call rings: refused as a call ringing under it, and its popup closed
+    // at once, since the call keys no longer answer it (see keys()).
+    QTest::addRow("do not disturb switched on")
+            << "phone.doNotDisturb=true"_q
+            << Outputs{QStringLiteral("popup-dismiss IncomingCall"),
+                       QStringLiteral("popup-dismiss WaitingCall"),
+                       QStringLiteral("bridge phone.rejectIncomingCall")};
 }
 
 void TestCallReactions::answer()
@@ -106,18 +129,16 @@ void TestCallReactions::answer()
     QFETCH(QString, event);
     QFETCH(Outputs, outputs);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(QStringLiteral("IncomingCall")));
+    m_hmi->apply("phone.incomingCall=true"_q);
+    QVERIFY(GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 
     qint64 since = GlobalHmi::mark();
-    if (event.isEmpty())
-        emit phone()->phoneIncomingCallRemoteRejection();
+    if (event.contains(QRegularExpression(QStringLiteral("[.!]"))))
+        m_hmi->apply(event);
     else
         since = GlobalHmi::post(event);
-    TestSupport::processUntilIdle();
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 }
 
 void TestCallReactions::waitingCall()
@@ -125,9 +146,8 @@ void TestCallReactions::waitingCall()
     phone()->setStatus(7);
     phone()->setCallConnected(true);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(QStringLiteral("WaitingCall")));
+    m_hmi->apply("phone.incomingCall=true"_q);
+    QVERIFY(GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 
     // Accepted once: a second accept finds nothing ringing.
     qint64 since = GlobalHmi::mark();
@@ -137,19 +157,16 @@ void TestCallReactions::waitingCall()
              Outputs{QStringLiteral("bridge phone.acceptIncomingCall")});
 
     // The phone fails to take it: the waiting-call popup gives way to the failure.
-    emit phone()->phoneCallAcceptingFailed();
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(QStringLiteral("CallAnswerNotResponding")));
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
+    m_hmi->apply("phone!phoneCallAcceptingFailed"_q);
+    QVERIFY(GlobalHmi::isOpen(QStringLiteral("CallAnswerNotResponding")));
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 
     // A further waiting call whose caller hangs up.
     phone()->setIncomingCall(false);
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(QStringLiteral("WaitingCall")));
-    emit phone()->phoneWaitingCallRemoteRejection();
-    TestSupport::processUntilIdle();
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
+    m_hmi->apply("phone.incomingCall=true"_q);
+    QVERIFY(GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
+    m_hmi->apply("phone!phoneWaitingCallRemoteRejection"_q);
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 }
 
 void TestCallReactions::ringingEnds_data()
@@ -170,20 +187,16 @@ void TestCallReactions::ringingEnds()
     QFETCH(bool, connectionFirst);
     phone()->setCallConnected(duringCall);
     QVERIFY(m_hmi->run());
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(duringCall ? QStringLiteral("WaitingCall")
-                                        : QStringLiteral("IncomingCall")));
+    m_hmi->apply("phone.incomingCall=true"_q);
+    QVERIFY(GlobalHmi::isOpen(duringCall ? QStringLiteral("WaitingCall")
+                                         : QStringLiteral("IncomingCall")));
 
-    for (const bool connectionNow : {connectionFirst, !connectionFirst}) {
-        if (connectionNow)
-            phone()->setCallConnected(!duringCall);
-        else
-            phone()->setIncomingCall(false);
-        TestSupport::processUntilIdle();
-    }
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("WaitingCall")));
+    for (const bool connectionNow : {connectionFirst, !connectionFirst})
+        m_hmi->apply(connectionNow ? QStringLiteral("phone.callConnected=")
+                                     + QLatin1String(duringCall ? "false" : "true")
+                                   : "phone.incomingCall=false"_q);
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("WaitingCall")));
 }
 
 void TestCallReactions::missedCall_data()
@@ -214,12 +227,11 @@ void TestCallReactions::missedCall()
     QVERIFY(m_hmi->run());
 
     const qint64 since = GlobalHmi::mark();
-    emit phone()->missedCallsPresent();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!missedCallsPresent"_q);
     const Outputs missed{QStringLiteral("popup-dismiss IncomingCall"),
                          QStringLiteral("popup-request MissedCallPopup")};
     QCOMPARE(GlobalHmi::outputsSince(since), popup ? missed : Outputs());
-    QCOMPARE(GlobalHmi::shown(QStringLiteral("MissedCallPopup")), popup);
+    QCOMPARE(GlobalHmi::isOpen(QStringLiteral("MissedCallPopup")), popup);
 
     // Leaving the popup asks the recent-calls list for the calls just missed.
     const qint64 closed = GlobalHmi::mark();
@@ -263,9 +275,8 @@ void TestCallReactions::dialingFailures()
 
     // A call getting through clears a failure still shown.
     phone()->setStatus(3);
-    phone()->setStatus(7);
-    TestSupport::processUntilIdle();
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("DialingFailed")));
+    m_hmi->apply("phone.status=7"_q);
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("DialingFailed")));
 }
 
 void TestCallReactions::callEnded_data()
@@ -293,8 +304,7 @@ void TestCallReactions::callEnded()
     QVERIFY(m_hmi->run());
 
     const qint64 since = GlobalHmi::mark();
-    emit phone()->multipartyActiveCallEnded();
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone!multipartyActiveCallEnded"_q);
     QCOMPARE(GlobalHmi::outputsSince(since), outputs);
 
     // Confirming closes the popup; a confirmation without the popup does nothing.
@@ -303,7 +313,7 @@ void TestCallReactions::callEnded()
     GlobalHmi::post(Events::HmiPhone_CallEndConfirmed);
     QCOMPARE(GlobalHmi::outputsSince(confirmed).count(QStringLiteral("popup-dismiss CallEnded")),
              statusBar == 2 ? 0 : 1);
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("CallEnded")));
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("CallEnded")));
 }
 
 void TestCallReactions::roamingConfirmation_data()
@@ -335,9 +345,8 @@ void TestCallReactions::roamingConfirmation()
 void TestCallReactions::incomingCallRoadThroughThePlugin()
 {
     QVERIFY(m_hmi->run(QStringLiteral(HMIPHONE_PLUGIN_FILE)));
-    phone()->setIncomingCall(true);
-    TestSupport::processUntilIdle();
-    QVERIFY(GlobalHmi::shown(QStringLiteral("IncomingCall")));
+    m_hmi->apply("phone.incomingCall=true"_q);
+    QVERIFY(GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 
     QObject *controller = nullptr;
     for (QObject *child : m_hmi->host().integration()->children()) {
@@ -353,19 +362,17 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
                       QStringLiteral("popup-dismiss IncomingCall"),
                       QStringLiteral("bridge phone.acceptIncomingCall"),
                       QStringLiteral("transient PhoneAcceptedIncomingCall")}));
-    QVERIFY(!GlobalHmi::shown(QStringLiteral("IncomingCall")));
+    QVERIFY(!GlobalHmi::isOpen(QStringLiteral("IncomingCall")));
 
     phone()->setCallConnected(true);
     phone()->setIncomingCall(false);
-    phone()->setStatus(7);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.status=7"_q);
     QCOMPARE(Brisken::ViewController::instance()->activeView(),
              QStringLiteral("PHONE.CallInProgress"));
 
     since = GlobalHmi::mark();
     phone()->setCallConnected(false);
-    phone()->setStatus(0);
-    TestSupport::processUntilIdle();
+    m_hmi->apply("phone.status=0"_q);
     QCOMPARE(TestSupport::journalValues(QStringLiteral("back"), QStringLiteral("steps"), since),
              QStringList{QStringLiteral("1")});
     QCOMPARE(Brisken::ViewController::instance()->activeView(), QStringLiteral("HOST.Home"));
@@ -373,7 +380,19 @@ void TestCallReactions::incomingCallRoadThroughThePlugin()
 
 namespace {
 
-enum Situation { Idle, Ringing, Waiting, OneCall, TwoCalls, Dialling };
+// The last four: no call, in call status 1, 2, 11 and 12.
+enum Situation {
+    Idle,
+    Ringing,
+    Waiting,
+    OneCall,
+    TwoCalls,
+    Dialling,
+    Status1,
+    Status2,
+    Status11,
+    Status12
+};
 // Covered: another popup comes up over the call popup before the key.
 enum Condition {
     Private = 1,
@@ -381,7 +400,8 @@ enum Condition {
     Projection = 4,
     Rendering = 8,
     DoNotDisturb = 16,
-    Covered = 32
+    Covered = 32,
+    DoNotDisturbLater = 64 // switched on while the call rings
 };
 
 } // namespace
@@ -422,6 +442,7 @@ void TestCallReactions::keys_data()
     const Outputs endCall{out("bridge phone.endCall")};
     const Outputs swapCall{out("bridge phone.swapCall")};
 
+    // clang-format off
     row("idle: phone key opens the phone", Idle, 0, 12, 2, phoneMenu);
     row("idle: phone key press", Idle, 0, 12, 1, {});
     row("idle: phone key long", Idle, 0, 12, 3, {});
@@ -442,9 +463,15 @@ void TestCallReactions::keys_data()
     row("idle, projection: phone key", Idle, Projection, 12, 2, {});
     row("idle, projection: 77", Idle, Projection, 77, 1, {});
     row("idle, projection: 91 release", Idle, Projection, 91, 4, {});
+    for (const auto &[key, kind] :
+         {std::pair{78, 1}, {50, 1}, {80, 1}, {90, 2}, {91, 2}, {90, 3}, {90, 4}, {91, 3}})
+        QTest::addRow("idle, projection: %d/%d", key, kind) << int(Idle) << int(Projection) << key << kind << Outputs();
+    row("two calls, projection: send 79", TwoCalls, Projection, 79, 1, {});
     row("idle, blocked: 77", Idle, Blocked, 77, 1, {});
     row("idle, blocked: end", Idle, Blocked, 50, 1, {});
     row("idle, blocked: 90 long", Idle, Blocked, 90, 3, hardKey("processSWCSeekDownLongPress"));
+    row("idle, blocked: 90 short", Idle, Blocked, 90, 2, {});
+    row("idle, blocked: 91 short", Idle, Blocked, 91, 2, {});
     row("ringing: phone key accepts", Ringing, 0, 12, 2, accepted + closeIncoming);
     row("ringing: phone key long rejects", Ringing, 0, 12, 3, rejected + closeIncoming);
     row("ringing: 77", Ringing, 0, 77, 1, acceptEvent);
@@ -458,6 +485,21 @@ void TestCallReactions::keys_data()
     row("ringing, rendering: phone key", Ringing, Rendering, 12, 2, accepted + closeIncoming);
     row("ringing, rendering: send", Ringing, Rendering, 49, 1, {});
     row("ringing, do not disturb: phone key", Ringing, DoNotDisturb, 12, 2, {});
+    // Under do-not-disturb the call was refused at once: the call keys do what they do without
+    // a ringing call, though the phone still reports it.
+    row("ringing, do not disturb: 77 seeks", Ringing, DoNotDisturb, 77, 1, hardKey("processCombinedSeekLeftKey"));
+    row("ringing, do not disturb: 78 seeks", Ringing, DoNotDisturb, 78, 1, hardKey("processCombinedSeekRightKey"));
+    row("ringing, do not disturb: send", Ringing, DoNotDisturb, 49, 1, {});
+    row("ringing, do not disturb: send 79", Ringing, DoNotDisturb, 79, 1, {});
+    row("ringing, do not disturb: end", Ringing, DoNotDisturb, 50, 1, phoneSection);
+    row("ringing, do not disturb: 90 seeks", Ringing, DoNotDisturb, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("ringing, do not disturb: 91 seeks", Ringing, DoNotDisturb, 91, 2, hardKey("processSWCSeekUpShortPress"));
+    row("ringing, switched to do not disturb: 90 seeks", Ringing, DoNotDisturbLater, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("ringing, switched to do not disturb: 80", Ringing, DoNotDisturbLater, 80, 1, phoneSection);
+    row("waiting, do not disturb: 77", Waiting, DoNotDisturb, 77, 1, {});
+    row("waiting, do not disturb: 78 ends the call", Waiting, DoNotDisturb, 78, 1, endCall);
+    row("ringing, blocked: 90 short", Ringing, Blocked, 90, 2, {});
+    row("ringing, blocked: 91 short", Ringing, Blocked, 91, 2, {});
     row("ringing, blocked: 77", Ringing, Blocked, 77, 1, {});
     row("ringing, blocked: phone key", Ringing, Blocked, 12, 2, accepted + closeIncoming);
     row("waiting: phone key accepts", Waiting, 0, 12, 2, accepted + closeWaiting);
@@ -470,6 +512,7 @@ void TestCallReactions::keys_data()
     row("waiting: send 79 short", Waiting, 0, 79, 2, closeWaiting);
     row("waiting: end 80", Waiting, 0, 80, 1, rejectWaiting);
     row("waiting: end short", Waiting, 0, 50, 2, closeWaiting);
+    row("waiting: end 80 short", Waiting, 0, 80, 2, closeWaiting);
     row("waiting: 90 accepts, then closes", Waiting, 0, 90, 2, acceptWaiting + closeWaiting);
     row("waiting: 91 short", Waiting, 0, 91, 2, rejected + closeWaiting + rejectEvent);
     row("waiting, rendering: send short", Waiting, Rendering, 49, 2, closeWaiting);
@@ -492,10 +535,10 @@ void TestCallReactions::keys_data()
     row("one call, private: 77", OneCall, Private, 77, 1, hardKey("processCombinedSeekLeftKey"));
     row("one call, private: 78", OneCall, Private, 78, 1, hardKey("processCombinedSeekRightKey"));
     row("one call, private: end", OneCall, Private, 80, 1, {});
-    row("one call, private: 90 short", OneCall, Private, 90, 2,
-        hardKey("processSWCSeekDownShortPress"));
-    row("one call, private: 91 long", OneCall, Private, 91, 3,
-        hardKey("processSWCSeekUpLongPress"));
+    row("one call, private: 90 short", OneCall, Private, 90, 2, hardKey("processSWCSeekDownShortPress"));
+    row("one call, private: 91 long", OneCall, Private, 91, 3, hardKey("processSWCSeekUpLongPress"));
+    row("one call, private: 91 short", OneCall, Private, 91, 2, hardKey("processSWCSeekUpShortPress"));
+    row("one call, private: 90 release", OneCall, Private, 90, 4, hardKey("processSWCSeekDownLongRelease"));
     row("one call, blocked: phone key long", OneCall, Blocked, 12, 3, {});
     row("one call, blocked: 78", OneCall, Blocked, 78, 1, {});
     row("one call, blocked: 91 long", OneCall, Blocked, 91, 3, endCall);
@@ -515,6 +558,16 @@ void TestCallReactions::keys_data()
     row("dialling: end 80", Dialling, 0, 80, 1, endCall);
     row("dialling: 91 short", Dialling, 0, 91, 2, endCall);
     row("dialling: 90 release", Dialling, 0, 90, 4, {});
+    // The end key opens the phone in status 0 only; the phone keeps long presses in 3 to 11.
+    row("status 1: end", Status1, 0, 50, 1, {});
+    row("status 2: end 80", Status2, 0, 80, 1, {});
+    row("status 12: end", Status12, 0, 50, 1, {});
+    row("status 2: 90 long", Status2, 0, 90, 3, hardKey("processSWCSeekDownLongPress"));
+    row("status 11: 90 long", Status11, 0, 90, 3, {});
+    row("status 11: 91 release", Status11, 0, 91, 4, {});
+    row("status 12: 90 long", Status12, 0, 90, 3, hardKey("processSWCSeekDownLongPress"));
+    row("status 12: 91 release", Status12, 0, 91, 4, hardKey("processSWCSeekUpLongRelease"));
+    // clang-format on
 }
 
 void TestCallReactions::keys()
@@ -524,7 +577,7 @@ void TestCallReactions::keys()
     QFETCH(int, key);
     QFETCH(int, kind);
     QFETCH(Outputs, outputs);
-    const int status[] = {0, 0, 7, 7, 9, 3};
+    const int status[] = {0, 0, 7, 7, 9, 3, 1, 2, 11, 12};
     phone()->setStatus(status[situation]);
     phone()->setCallConnected(situation >= Waiting && situation <= TwoCalls);
     phone()->setMultipleCallsConnected(situation == TwoCalls);
@@ -537,13 +590,13 @@ void TestCallReactions::keys()
     Mavrosk::ProjectionSource::instance()->setIsRendering(conditions & Rendering);
     QVERIFY(m_hmi->run());
     if (situation == Ringing || situation == Waiting) {
-        phone()->setIncomingCall(true);
-        TestSupport::processUntilIdle();
+        m_hmi->apply("phone.incomingCall=true"_q);
     }
+    if (conditions & DoNotDisturbLater)
+        m_hmi->apply(QStringLiteral("phone.doNotDisturb=true"));
     if (conditions & Covered) {
-        emit phone()->phoneRoamingModeReceived();
-        TestSupport::processUntilIdle();
-        QVERIFY(GlobalHmi::shown(QStringLiteral("RoamingWarning")));
+        m_hmi->apply("phone!phoneRoamingModeReceived"_q);
+        QVERIFY(GlobalHmi::isOpen(QStringLiteral("RoamingWarning")));
     }
 
     const qint64 since = GlobalHmi::mark();

@@ -33,14 +33,24 @@ hands-free               |                     | phone!phoneAudioHandsfreeErrorR
 audio internal, call     | $call               | phone!phoneAudioInternalErrorReceived | popup SiriConnectionNotRespondingPopup
 audio internal           |                     | phone!phoneAudioInternalErrorReceived |
 Siri not enabled         |                     | HmiPhone_ShowSiriNotEnabledRequest | popup siriFeatureNotEnabledPopup
-pairing by voice         |                     | speech!displayPairingPopup | intent 14(PHONE)
-battery low              | phone.lowBatteryNotification=true | phone.deviceBatteryLevel=1 | popup BatteryLow
+unstable connection      |                     | phone!unstableDeviceConnectionWithKovaReceived | popup UnstableDeviceConnectionWithKovaPopup
+reconnection failed      |                     | phone!deviceReconnectFailReceived | popup UnableToConnect
+Siri not responding      |                     | phone!phoneSiriNoResponseErrorReceived | popup SiriConnectionNotRespondingPopup
+Siri without audio       |                     | phone!phoneSiriSCOchannelNotActiveReceived | popup siriFeatureNotEnabledPopup
+contacts too large       |                     | phone!phoneContactsTooLargeErrorReceived | popup ContactsListTooLargePopup
+pairing by voice         |                     | speech!displayPairingPopup | intent 14(PHONE) voice
+add phone, phone screens | HmiPhone_RootStateRequest | HmiPhone_AddPhoneRequest | intent 14(PHONE)
+add phone, elsewhere     |                     | HmiPhone_AddPhoneRequest |
+battery low              | $battery=true       | phone.deviceBatteryLevel=1 | popup BatteryLow
+battery low, no phone    | $battery=true; bluetooth.deviceConnected=false | phone.deviceBatteryLevel=1 |
+battery low, not wanted  | $battery=false      | phone.deviceBatteryLevel=1 |
 to the handset           | $call               | phone.status=12 | phone.checkPhoneStatus(); popup $standby
 back from the handset    | phone.status=12     | phone.status=7  | dismiss $standby
 retry contacts download  | bluetooth.phoneDevice=4; bluetooth.selectedDevice=2 | HmiPhone_RetryAutomaticContactDownloadRequest | phone.retryPhoneBookDownload(4)
 
 extended 10, call        | $extended=10; $call | $mode(2); +15 | @7; popup $standby; @10; $private; $shutdown
 extended 3, private      | $extended=3; phone.privateMode=true | $mode(3); +15 | @3; $shutdown
+extended 3, call         | $extended=3; $call  | $mode(2); +15 | @3; $private; $shutdown
 extended, changed again  | $extended=5         | $mode(2); +2; $mode(3); +1; $mode(2); +10 | @5; $private; $shutdown
 extended, mode 1 afresh  | $extended=5         | $mode(2); +4; $mode(1); +15 | @4; dismiss $standby; $cleared; @9; $private; $shutdown
 extended, mode 0 ends    | $extended=5         | $mode(2); +4; $mode(0); +15 | @4; dismiss $standby; $cleared
@@ -77,6 +87,7 @@ contacts stopped         | $contacts=2         | $contacts=3 | hide $pbInitiated
 
 const char *const names[][2] = {
         {"$call", "phone.callConnected=true"},
+        {"$battery", "phone.lowBatteryNotification"},
         {"$lost", "phone!nonUserDeviceDisconnectReceived"},
         {"$door", "phone!phoneDriverDoorOpenLinkLossReconnectFailedReceived"},
         {"$standby", "PhoneCallStandByModePopup"},

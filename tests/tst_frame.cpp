@@ -1,12 +1,15 @@
-// The module frame as a host sees it: the plug-in file, the integration's identity, the QML types
-// and context properties, the identifier tables and the intent handler.
+// The module frame as a host sees it: the plug-in file, the integration's and the settings
+// submodule's identity, the QML types and context properties, the identifier tables and the intent
+// handler.
 
 #include "testsupport.h"
 
 #include <hmiphonecontroller.h>
 #include <hmiphoneintegration.h>
+#include <hmiphonesettingshostedsubmodule.h>
 #include <hmiphoneviews.h>
 
+#include <brisken/hmiaction.h>
 #include <mavrosk/bridge.h>
 #include <quorvel/hmitransition.h>
 #include <quorvel/hmiviewstate.h>
@@ -66,6 +69,22 @@ private slots:
                  QStringLiteral("plugins/hmiphone/view-descriptor.json"));
         QVERIFY(integration->rootStateIdentifier().endsWith(QLatin1String("Root")));
         QCOMPARE(integration->iconUrl().toString(), QStringLiteral("menubar/icon_phone"));
+    }
+
+    // What the settings module reads of the phone's settings submodule to list and build it.
+    void settingsSubmoduleIdentity()
+    {
+        HmiPhoneSettingsHostedSubmodule submodule(nullptr, nullptr);
+        QCOMPARE(submodule.moduleIdentifier(), "PHONE"_q);
+        QCOMPARE(submodule.submoduleName(), "Phone settings submodule."_q);
+        QCOMPARE(submodule.viewDescriptorFile(),
+                 "plugins/hmiphone/settings-view-descriptor.json"_q);
+        const Brisken::HmiAction *entry = submodule.subModuleEntryAction();
+        QCOMPARE(entry->name(), "Phone"_q);
+        QCOMPARE(entry->iconPath(), "settings/icon_phone"_q);
+        QCOMPARE(entry->actionType(), 3);
+        QCOMPARE(entry->translationContext(), "HmiPhone::HmiPhoneSettingsHostedSubmodule"_q);
+        QCOMPARE(entry->parent(), &submodule);
     }
 
     void integrationAnswersOnlyItsName_data()

@@ -8,14 +8,16 @@
 
 #include <quorvel/guardedpropertychangetransition.h>
 #include <quorvel/guardedtransition.h>
+#include <quorvel/hmiabstracttransition.h>
 #include <quorvel/intsignaltransition.h>
 #include <quorvel/keysignaltransition.h>
 #include <quorvel/popupstate.h>
 
 namespace {
 
-// The global transition list, in registration order, as "source: trigger > target" (a source
-// only for the transitions that keep theirs) and the level.
+// The global transition list, in registration order, as "source: trigger > target extras" (a
+// source only for the transitions that keep theirs; extras: "exclN" the exclusive group N, "voice"
+// a voice event) and the level.
 struct ListedTransition
 {
     const char *trigger;
@@ -31,16 +33,16 @@ const ListedTransition expectedTransitions[] = {
     {"signal StatusBarController.statusBarVisibleChanged(bool)", 2},
     {"event HmiPhone_ShowContactsRequest > PhoneBookCmp", 2},
     {"PHONE.Root: event HmiPhone_AddPhoneRequest", 3},
-    {"signal Speech.displayPairingPopup()", 3},
+    {"signal Speech.displayPairingPopup() voice", 3},
     {"event HmiPhone_EndCallRequest", 3},
     {"property Phone.incomingCall", 3},
     {"property Phone.incomingCall", 3},
-    {"change Phone.status 3>7", 3},
-    {"change Phone.status 4>9", 3},
-    {"change Phone.status 5>10", 3},
-    {"change Phone.status 6>11", 3},
+    {"change Phone.status 3>7 excl0", 3},
+    {"change Phone.status 4>9 excl0", 3},
+    {"change Phone.status 5>10 excl0", 3},
+    {"change Phone.status 6>11 excl0", 3},
     {"change Phone.privateMode *>1", 3},
-    {"property Phone.status > PhoneCallCmp", 3},
+    {"property Phone.status > PhoneCallCmp excl1", 3},
     {"change Phone.callConnected false>true", 3},
     {"key 77/1", 3},
     {"key 12/3", 3},
@@ -63,15 +65,15 @@ const ListedTransition expectedTransitions[] = {
     {"property Phone.deviceBatteryLevel", 3},
     {"event HmiPhone_ShowStatusBarAlertsRequest > PhoneStatusAlertsCmp", 3},
     {"event HmiPhone_StopAnswering", 3},
-    {"property Phone.status", 3},
-    {"change Phone.status 12>*", 3},
+    {"property Phone.status excl0", 3},
+    {"change Phone.status 12>* excl0", 3},
     {"signal Phone.nonUserDeviceDisconnectReceived()", 3},
     {"signal Phone.nonUserDeviceDisconnectReceived()", 3},
     {"signal Phone.newTextMessageAlert()", 3},
     {"signal Phone.phoneCallAcceptingFailed()", 3},
     {"signal Phone.newTextMessageDetailsReady()", 3},
     {"event HmiPhone_MakeCallRequest", 3},
-    {"signal Phone.showMessageListRequested() > PhoneSmsCmp", 3},
+    {"signal Phone.showMessageListRequested() > PhoneSmsCmp voice", 3},
     {"signal Phone.listenToMessageRequested()", 3},
     {"signal Phone.textMessageDetailsReady()", 3},
     {"signal Phone.newTextMessageAlert()", 3},
@@ -87,8 +89,8 @@ const ListedTransition expectedTransitions[] = {
     {"event HmiPhoneSms_RetrySendTextMessage", 3},
     {"signal Phone.sendMessageRequested()", 3},
     {"signal Phone.cancelSendMessageRequested()", 3},
-    {"change Phone.status *>3", 3},
-    {"change Phone.status *>4", 3},
+    {"change Phone.status *>3 excl0", 3},
+    {"change Phone.status *>4 excl0", 3},
     {"signal Phone.multipartyActiveCallEnded()", 3},
     {"signal Phone.dtmfKeyPressNoResponseErrorReceived()", 3},
     {"signal Phone.phoneAudioTransferErrorReceived()", 3},
@@ -126,9 +128,9 @@ const ListedTransition expectedTransitions[] = {
     {"event HmiPhone_RoamingMode", 3},
     {"event HmiPhone_ShowSiriNotEnabledRequest", 3},
     {"signal Phone.phoneSiriSCOchannelNotActiveReceived()", 3},
-    {"change Phone.siriActive false>true", 2},
+    {"change Phone.siriActive false>true excl2", 2},
     {"change Phone.siriActive true>false", 2},
-    {"change Phone.phoneVoiceServiceActive false>true", 2},
+    {"change Phone.phoneVoiceServiceActive false>true excl2", 2},
     {"change Phone.phoneVoiceServiceActive true>false", 2},
     {"signal Bluetooth.deviceConnectedChanged(bool)", 3},
     {"signal HmiPhoneController.phoneMenuExited()", 2},
@@ -138,6 +140,7 @@ const ListedTransition expectedTransitions[] = {
     {"event HmiPhone_ShowSmsIphoneRequest > PhoneSmsCmp", 3},
     {"signal Phone.sendMessageNoResponseFromPhoneAlert()", 3},
     {"signal Projection.projectionNotActive(bool)", 3},
+    {"change Phone.doNotDisturb false>true", 3},
 };
 
 // The global popups in list order, all at level 3: view, auto-dismiss (0: until dismissed).
@@ -207,6 +210,14 @@ QString describe(QAbstractTransition *transition)
     }
     if (transition->targetState())
         text += QStringLiteral(" > ") + transition->targetState()->objectName();
+    // What the host reads of a transition besides its trigger: its exclusive group and the voice
+    // flag.
+    if (auto *hmi = qobject_cast<Quorvel::HmiAbstractTransition *>(transition)) {
+        if (hmi->parallelExclusiveGroup() >= 0)
+            text += QStringLiteral(" excl%1").arg(hmi->parallelExclusiveGroup());
+        if (hmi->isVREventTransition())
+            text += QStringLiteral(" voice");
+    }
     const QAbstractState *source = transition->sourceState();
     if (source && source->objectName() != QLatin1String("AdoptedTransitions"))
         text.prepend(source->objectName() + QStringLiteral(": "));

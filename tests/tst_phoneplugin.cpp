@@ -194,7 +194,8 @@ private slots:
     }
 
     // QML can call the controller's inherited deleteLater(). Whatever then reaches the module
-    // for the controller is refused with a warning, not sent to a deleted object.
+    // for the controller is refused with a warning, not sent to a deleted object; what does not
+    // need the controller still works.
     void controllerDeletedFromQml_data()
     {
         QTest::addColumn<std::function<void()>>("request");
@@ -233,6 +234,27 @@ private slots:
         QTest::newRow("end key opens no phone") << std::function<void()>([] {
             Mavrosk::KeySource::instance()->sendKeyEvent(50, 1);
         }) << QString();
+        // The module's own events go to the machine, not through the controller.
+        const auto posts = [](const char *event, std::function<void()> cause) {
+            return std::function<void()>([event, cause] {
+                const qint64 since = TestSupport::mark();
+                cause();
+                TestSupport::processUntilIdle();
+                QCOMPARE(TestSupport::journalValues(QStringLiteral("event"), QStringLiteral("name"),
+                                                    since),
+                         QStringList{QLatin1String(event)});
+            });
+        };
+        QTest::newRow("private mode closes the in-call keypad")
+                << posts("HmiPhone_HideCallKeyPadRequest",
+                         [] { Mavrosk::PhoneSource::instance()->setPrivateMode(true); })
+                << QString();
+        QTest::newRow("missed call popup asks for the calls") << posts(
+                "HmiPhone_RequestRecentCallList", [] {
+                    emit Mavrosk::PhoneSource::instance()->missedCallsPresent();
+                    TestSupport::processUntilIdle();
+                    Quorvel::StateMachine::instance()->dismissPopup(Views::MissedCallPopup);
+                }) << QString();
         QTest::newRow("low battery guard") << std::function<void()>([] {
             Mavrosk::PhoneSource::instance()->setBridgeValue(
                     QStringLiteral("lowBatteryNotification"), true);

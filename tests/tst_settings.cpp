@@ -162,8 +162,7 @@ void TestSettings::settings()
     for (const Platform::JournalEntry &entry : Platform::Journal::instance()->entriesSince(since)) {
         const QString call = entry.fields.value(QStringLiteral("call")).toString();
         if (entry.kind == QLatin1String("intent"))
-            lines << QStringLiteral("intent %1()")
-                             .arg(entry.fields.value(QStringLiteral("action")).toInt());
+            lines << TestSupport::journalLines(entry.sequence - 1).value(0);
         else if (entry.kind == QLatin1String("menu-entry"))
             lines << QStringLiteral("menu-entry ")
                             + entry.fields.value(QStringLiteral("enabled")).toString();

@@ -99,7 +99,8 @@ private slots:
                  result);
         const QVariantList call{action, args, true, QStringLiteral("extra")};
         QCOMPARE(handler.calls, action == 99 ? QVariantList() : QVariantList{QVariant(call)});
-        QCOMPARE(intents(since), QStringList{QStringLiteral("intent %1(0123,7)").arg(action)});
+        QCOMPARE(intents(since),
+                 QStringList{QStringLiteral("intent %1(0123,7) flag extra=extra").arg(action)});
 
         // A handler's status change reaches the manager's listeners.
         emit handler.actionStatusChanged(5, false);
@@ -143,7 +144,8 @@ private slots:
         sender.setObjectName(QStringLiteral("second"));
         withProvider();
 
-        const QStringList twice{QStringLiteral("intent 14(PHONE)"), QStringLiteral("intent 70()")};
+        const QStringList twice{QStringLiteral("intent 14(PHONE) voice"),
+                                QStringLiteral("intent 70()")};
         QCOMPARE(intents(since),
                  twice + twice + QStringList{QStringLiteral("intent 7(from provider)")});
         QCOMPARE(handler.calls.size(), 4);

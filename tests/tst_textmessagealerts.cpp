@@ -29,8 +29,9 @@ private slots:
 // Each row: bridge values before start, then steps: "@ms" lets time pass up to that moment,
 // "source.property=value" is the phone's side writing a value, "source.signal[:argument]" is the
 // phone's side emitting a signal, anything else is an event posted to the machine. The
-// outputs are what the HMI did, in order: "@ms" when time has passed, "+popup"/"-popup" shown and
-// hidden, "[view]", bridge commands, "!event" posted, "count=n" of received messages.
+// outputs are what the HMI did, in order: "@ms" when time has passed, "+popup"/"-popup" opened
+// and closed (a popup covered by another stays open), "[view]", bridge commands, "!event" posted,
+// "count=n" of received messages.
 void TestTextMessageAlerts::textMessages_data()
 {
     QTest::addColumn<QString>("values");
@@ -40,17 +41,20 @@ void TestTextMessageAlerts::textMessages_data()
 
     // clang-format off
     QTest::addRow("alert: single, again after it closed") << ""_q << "phone!newTextMessageAlert @9000 phone!newTextMessageAlert @30000"_q << "count=1 +NewTextMessageAlert2 @8000 -NewTextMessageAlert2 @9000 count=2 +NewTextMessageAlert2 @17000 -NewTextMessageAlert2"_q << ""_q;
-    QTest::addRow("alert: three in a row, then one more") << ""_q << "phone!newTextMessageAlert @2000 phone!newTextMessageAlert @5000 phone!newTextMessageAlert @14000 phone!newTextMessageAlert @30000"_q << "count=1 +NewTextMessageAlert2 @2000 count=2 -NewTextMessageAlert2 +MultipleTextMessagesReceived @5000 count=3 @13000 -MultipleTextMessagesReceived count=0 @14000 count=1 +NewTextMessageAlert2 @22000 -NewTextMessageAlert2"_q << ""_q;
+    QTest::addRow("alert: three in a row, then one more") << ""_q << "phone!newTextMessageAlert @2000 phone!newTextMessageAlert @5000 phone!newTextMessageAlert @14000 phone!newTextMessageAlert @30000"_q << "count=1 +NewTextMessageAlert2 @2000 count=2 +MultipleTextMessagesReceived -NewTextMessageAlert2 @5000 count=3 @13000 -MultipleTextMessagesReceived count=0 @14000 count=1 +NewTextMessageAlert2 @22000 -NewTextMessageAlert2"_q << ""_q;
     QTest::addRow("alert: during a call") << "phone.callConnected=true phone.status=7"_q << "phone!newTextMessageAlert @1000 phone!newTextMessageAlert @30000"_q << "+NewTextMessageAlert1 @8000 -NewTextMessageAlert1"_q << ""_q;
     QTest::addRow("alert: while ringing") << "phone.incomingCall=true"_q << "phone!newTextMessageAlert @30000"_q << "+NewTextMessageAlert1 @8000 -NewTextMessageAlert1"_q << ""_q;
     QTest::addRow("alert: do not disturb") << "phone.doNotDisturb=true"_q << "phone!newTextMessageAlert @30000"_q << ""_q << ""_q;
     QTest::addRow("alert: hear it keeps it up") << ""_q << "phone!newTextMessageAlert @3000 HmiPhone_HearNewTextMessage phone!newTextMessageDetailsReady HmiPhone_StopHearNewTextMessage @30000"_q << "count=1 +NewTextMessageAlert2 @3000 requestNewTextMessageDetails() setHearItPressed(true) textMessagePlayback(Late) stopTextMessagePlayback() @11000 -NewTextMessageAlert2 requestTextMessagesInbox() setHearItPressed(false)"_q << ""_q;
+    QTest::addRow("alert: the multiple alert closes the in-call one") << ""_q << "phone!newTextMessageAlert phone.callConnected=true phone!newTextMessageAlert phone.callConnected=false phone!newTextMessageAlert"_q << "count=1 +NewTextMessageAlert2 +NewTextMessageAlert1 count=2 +MultipleTextMessagesReceived -NewTextMessageAlert2 -NewTextMessageAlert1"_q << ""_q;
+    QTest::addRow("alert: the replies close it") << ""_q << "phone!newTextMessageAlert phone!showReplyMessagesRequested"_q << "count=1 +NewTextMessageAlert2 checkPhoneStatus() [PhoneSmsReplyView] -NewTextMessageAlert2"_q << ""_q;
     QTest::addRow("alert: buttons need the alert") << ""_q << "HmiPhone_HearNewTextMessage HmiPhone_HideNewTextMessageAlert HmiPhone_ViewNewTextMessage phone!newTextMessageDetailsReady @30000"_q << ""_q << ""_q;
     QTest::addRow("alert: the cluster hears at any time") << ""_q << "phone!phoneSmsNewTextClusterHearItRequestReceived phone!newTextMessageDetailsReady @30000"_q << "requestNewTextMessageDetails() setHearItPressed(true) textMessagePlayback(Late)"_q << ""_q;
     QTest::addRow("alert: hidden, then a new one") << ""_q << "phone!newTextMessageAlert HmiPhone_HideNewTextMessageAlert phone!newTextMessageAlert phone!phoneSmsNewTextClusterIgnoreRequestReceived @30000"_q << "count=1 +NewTextMessageAlert2 -NewTextMessageAlert2 count=2 +NewTextMessageAlert2 -NewTextMessageAlert2"_q << ""_q;
     QTest::addRow("alert: view") << ""_q << "phone!newTextMessageAlert HmiPhone_ViewNewTextMessage @30000"_q << "count=1 +NewTextMessageAlert2 -NewTextMessageAlert2 requestNewTextMessageDetails() checkPhoneStatus() [PhoneSmsView]"_q << ""_q;
     QTest::addRow("alert: reply") << ""_q << "phone!newTextMessageAlert HmiPhone_ReplyNewTextMessage @30000"_q << "count=1 +NewTextMessageAlert2 -NewTextMessageAlert2 checkPhoneStatus() [PhoneSmsReplyView]"_q << ""_q;
     QTest::addRow("listen from the list") << "phone.listenMessageLineNo=3"_q << "phone!textMessageDetailsReady phone!listenToMessageRequested phone!textMessageDetailsReady phone!textMessageDetailsReady"_q << "requestSelectedTextMessageDetails(2) textMessagePlayback(Late)"_q << ""_q;
+    QTest::addRow("listen: line 0") << "phone.listenMessageLineNo=0"_q << "phone!listenToMessageRequested phone!textMessageDetailsReady"_q << ""_q << "Listen Message Line No Index Out of Range "_q;
     QTest::addRow("listen: the smallest line number") << "phone.listenMessageLineNo=-2147483648"_q << "phone!listenToMessageRequested phone!textMessageDetailsReady"_q << ""_q << "Listen Message Line No Index Out of Range "_q;
 
     QTest::addRow("send: status 2, then the messages") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(2) @5000"_q << "send noResponse(false) +Progress -Progress +Success @5000 -Success !HmiPhone_ShowSmsRequest +TextMessagingOff"_q << ""_q;
@@ -58,10 +62,13 @@ void TestTextMessageAlerts::textMessages_data()
     QTest::addRow("send: status 3") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(3)"_q << "send noResponse(false) +Progress -Progress +NetworkFailure"_q << ""_q;
     QTest::addRow("send: status 4 is no outcome") << ""_q << "phone!sendMessageRequested phone!sendMessageStatusChanged(4)"_q << "send noResponse(false) +Progress"_q << ""_q;
     QTest::addRow("send: two retries, then the final failure") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(2)"_q << "send noResponse(false) +Progress -Progress +Failure send noResponse(false) -Failure +Progress -Progress +Failure send noResponse(false) -Failure +Progress -Progress +Failure -Failure +RetrySendTextMessageFailure send noResponse(false) -RetrySendTextMessageFailure +Progress -Progress +Failure send noResponse(false) -Failure +Progress -Progress +Success"_q << ""_q;
+    QTest::addRow("send: the next message retries afresh") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(2) HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) HmiPhoneSms_RetrySendTextMessage"_q << "send noResponse(false) +Progress -Progress +Failure send noResponse(false) -Failure +Progress -Progress +Failure send noResponse(false) -Failure +Progress -Progress +Success send noResponse(false) +Progress -Progress +Failure send noResponse(false) -Failure +Progress"_q << ""_q;
+    QTest::addRow("send: a new send closes the failures") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(3) phone!sendMessageNoResponseFromPhoneAlert phone!sendMessageRequested phone!sendMessageNoResponseFromPhoneAlert HmiPhoneSms_InitiateSendTextMessage"_q << "send noResponse(false) +Progress -Progress +NetworkFailure noResponse(true) +NoResponseFromPhone send noResponse(false) -NetworkFailure -NoResponseFromPhone +Progress noResponse(true) -Progress +NoResponseFromPhone send noResponse(false) -NoResponseFromPhone +Progress"_q << ""_q;
+    QTest::addRow("send: a retry closes the failures") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(3) HmiPhoneSms_RetrySendTextMessage phone!sendMessageNoResponseFromPhoneAlert HmiPhoneSms_RetrySendTextMessage"_q << "send noResponse(false) +Progress -Progress +NetworkFailure send noResponse(false) -NetworkFailure +Progress noResponse(true) -Progress +NoResponseFromPhone send noResponse(false) -NoResponseFromPhone +Progress"_q << ""_q;
     QTest::addRow("send: no response, late outcome ignored") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageNoResponseFromPhoneAlert phone!sendMessageStatusChanged(2)"_q << "send noResponse(false) +Progress noResponse(true) -Progress +NoResponseFromPhone"_q << ""_q;
-    QTest::addRow("send: no response after the outcome") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) phone!sendMessageNoResponseFromPhoneAlert"_q << "send noResponse(false) +Progress -Progress +Failure noResponse(true) -Failure +NoResponseFromPhone"_q << ""_q;
+    QTest::addRow("send: no response after the outcome") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageStatusChanged(1) phone!sendMessageNoResponseFromPhoneAlert"_q << "send noResponse(false) +Progress -Progress +Failure noResponse(true) +NoResponseFromPhone"_q << ""_q;
     QTest::addRow("send: a retry after no response is heard") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!sendMessageNoResponseFromPhoneAlert HmiPhoneSms_RetrySendTextMessage phone!sendMessageStatusChanged(2)"_q << "send noResponse(false) +Progress noResponse(true) -Progress +NoResponseFromPhone send noResponse(false) -NoResponseFromPhone +Progress -Progress +Success"_q << ""_q;
-    QTest::addRow("send: covered by an alert, then its view") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!newTextMessageAlert phone!sendMessageStatusChanged(2) HmiPhone_ViewNewTextMessage"_q << "send noResponse(false) +Progress count=1 -Progress +NewTextMessageAlert2 -NewTextMessageAlert2 +Success requestNewTextMessageDetails() checkPhoneStatus() [PhoneSmsView]"_q << ""_q;
+    QTest::addRow("send: covered by an alert, then its view") << ""_q << "HmiPhoneSms_InitiateSendTextMessage phone!newTextMessageAlert phone!sendMessageStatusChanged(2) HmiPhone_ViewNewTextMessage"_q << "send noResponse(false) +Progress count=1 +NewTextMessageAlert2 -Progress +Success -NewTextMessageAlert2 requestNewTextMessageDetails() checkPhoneStatus() [PhoneSmsView]"_q << ""_q;
     QTest::addRow("send: the connection changes") << ""_q << "HmiPhoneSms_InitiateSendTextMessage bluetooth!deviceConnectedChanged(true) phone!sendMessageStatusChanged(2)"_q << "send noResponse(false) +Progress -Progress"_q << ""_q;
     QTest::addRow("reply: line 2 by voice, confirmed") << ""_q << "phone.replyMessageLineNo=2 HmiPhoneSms_InitiateSendTextMessage"_q << "setReplyTextSelected(Late) +SendTextMessage send noResponse(false) -SendTextMessage +Progress"_q << ""_q;
     QTest::addRow("reply: line 0") << ""_q << "phone!replyMessageLineNoChanged(0)"_q << ""_q << "Reply Message Line No Index Out of Range "_q;
@@ -119,6 +126,18 @@ void TestTextMessageAlerts::textMessages()
     };
     static const QRegularExpression popupPrefix(
             QStringLiteral("^PhoneSms(SendTextMessage(?=\\w))?"));
+    // Popups by what is open, on top or covered: covering one is no change, closing one is.
+    QStringList open;
+    const auto noteOpen = [&] {
+        const QStringList now = Brisken::ViewController::instance()->openPopups();
+        for (const QString &id : qAsConst(open))
+            if (!now.contains(id))
+                note(QLatin1Char('-') + id.section(QLatin1Char('.'), 1).remove(popupPrefix));
+        for (const QString &id : now)
+            if (!open.contains(id))
+                note(QLatin1Char('+') + id.section(QLatin1Char('.'), 1).remove(popupPrefix));
+        open = now;
+    };
     QObject context;
     connect(controller, &HmiPhone::HmiPhoneController::receivedTextMessageCountChanged, &context,
             [&](int count) { note(QStringLiteral("count=") + QString::number(count)); });
@@ -128,10 +147,10 @@ void TestTextMessageAlerts::textMessages()
                                            .toString()
                                            .section(QLatin1Char('.'), 1);
                 const QString line = TestSupport::journalLines(entry.sequence - 1).value(0);
-                if (entry.kind.startsWith(QLatin1String("popup-s"))
-                    || entry.kind.startsWith(QLatin1String("popup-h")))
-                    note(QLatin1Char(entry.kind == QLatin1String("popup-shown") ? '+' : '-')
-                         + QString(id).remove(popupPrefix));
+                if (entry.kind.startsWith(QLatin1String("popup-"))
+                    && !entry.kind.endsWith(QLatin1String("request"))
+                    && !entry.kind.endsWith(QLatin1String("dismiss")))
+                    noteOpen();
                 else if (entry.kind == QLatin1String("view")
                          && id.startsWith(QLatin1String("PhoneSms")))
                     note(QLatin1Char('[') + id + QLatin1Char(']'));
@@ -153,6 +172,7 @@ void TestTextMessageAlerts::textMessages()
         else
             apply(step);
         TestSupport::processUntilIdle();
+        noteOpen();
     }
     QCOMPARE(seen.join(QLatin1Char(' ')), outputs.trimmed());
 }

@@ -37,6 +37,7 @@
 #include <quorvel/intsignaltransition.h>
 #include <quorvel/keysignaltransition.h>
 #include <quorvel/popupstate.h>
+#include <quorvel/statemachine.h>
 #include <taldris/hardkeycontroller.h>
 #include <taldris/hmiintentmanager.h>
 #include <taldris/hmiintentrequest.h>
@@ -323,6 +324,10 @@ void HmiPhoneGlobalStateHandler::buildTransitionChart(GlobalChart &chart, Phone_
             .keep(m_incomingCallOnProjectionDisconnectTransition)
             .guard(&H::incomingCallonPrjDisconnectTransitionEventTest)
             .run(&H::incomingCall).list(114);
+    // Do-not-disturb switched on while a call rings: that call is refused like one that rings
+    // under it.
+    chart.change(phone, "doNotDisturb", {false}, true)
+            .run(&H::rejectRingingCallOnDoNotDisturb).list(115);
     chart.signal(phone, &PhoneSource::phoneCallAcceptingFailed)
             .run(pm, &PM::showCallAcceptanceFailure).list(45);
     chart.property(phone, "incomingCall").keep(m_missedCallTransition)
@@ -640,6 +645,18 @@ void HmiPhoneGlobalStateHandler::incomingCallOutbound()
     m_popupManager->dismissIncomingCall();
 }
 
+// The driver asked not to be disturbed while a call rang: the call is refused as one that rings
+// under do-not-disturb (no transient), and its popup closes at once, since the call keys no longer
+// answer it. A call a projection owns stays the projection's.
+void HmiPhoneGlobalStateHandler::rejectRingingCallOnDoNotDisturb()
+{
+    if (!m_phoneSource->incomingCall() || projectionOwnsCall())
+        return;
+    m_popupManager->dismissIncomingCall();
+    m_popupManager->dismissWaitingCall();
+    m_phoneSource->rejectIncomingCall();
+}
+
 void HmiPhoneGlobalStateHandler::acceptIncomingCall()
 {
     m_popupManager->dismissIncomingCall();
@@ -759,16 +776,11 @@ void HmiPhoneGlobalStateHandler::addPhoneRequested()
                                                          {QVariant(ModuleName)});
 }
 
-// Posted through the controller, at normal priority, to the HMI's one machine, like every other
-// event of the module.
+// Posted straight to the HMI's one machine at normal priority: the module's own events must not
+// depend on the controller, which QML may have deleted.
 void HmiPhoneGlobalStateHandler::postEvent(const QString &name)
 {
-    if (!m_controller) {
-        qCWarning(hmiphone) << "HmiPhoneGlobalStateHandler: the controller is gone," << name
-                            << "not posted";
-        return;
-    }
-    m_controller->postEvent(new Quorvel::HmiEvent(name, QVariant()));
+    Quorvel::StateMachine::instance()->postEvent(new Quorvel::HmiEvent(name, QVariant()));
 }
 
 // --- Transient messages ------------------------------------------------------------------------

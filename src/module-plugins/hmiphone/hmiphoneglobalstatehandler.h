@@ -71,6 +71,7 @@ private slots:
     // Call reactions
     void incomingCall();
     void incomingCallOutbound();
+    void rejectRingingCallOnDoNotDisturb();
     void acceptIncomingCall();
     void rejectIncomingCall();
     void endCall();
@@ -195,6 +196,8 @@ private:
     Quorvel::PopupState *popup(const QString &view) const;
 
     void handleNewTextMessagesReceived();
+    bool projectionOwnsCall() const;
+    void hideSendFailures();
 
     void requestTransient(const QString &name);
     void hideTransient(const QString &name);

@@ -46,18 +46,21 @@ template<class Transition> void allowOnlyIf(Transition *transition, bool allowed
 
 } // namespace
 
+// A projection that owns the call but does not render it shows its own call screen.
+bool HmiPhoneGlobalStateHandler::projectionOwnsCall() const
+{
+    return !m_projectionSource->isRendering()
+            && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection;
+}
+
+// Do-not-disturb does not block: incomingCall() refuses such a call at once, where a blocked
+// transition would leave it ringing unseen.
 void HmiPhoneGlobalStateHandler::incomingCallTransitionEventTest(QEvent *)
 {
     auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
     if (!transition)
         return;
-    // A projection that owns the call but does not render it shows its own call screen.
-    if (!m_projectionSource->isRendering()
-        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
-        transition->setAllowTransition(false);
-        return;
-    }
-    transition->setAllowTransition(!m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall());
+    transition->setAllowTransition(!projectionOwnsCall() && m_phoneSource->incomingCall());
 }
 
 void HmiPhoneGlobalStateHandler::incomingCallKeySignalTransitionEventTest(QEvent *)
@@ -65,12 +68,8 @@ void HmiPhoneGlobalStateHandler::incomingCallKeySignalTransitionEventTest(QEvent
     auto *transition = qobject_cast<Quorvel::GuardedSignalTransition *>(sender());
     if (!transition)
         return;
-    if (!m_projectionSource->isRendering()
-        && m_projectionSource->projectionMode() == ProjectionMode::PhoneProjection) {
-        transition->setAllowTransition(false);
-        return;
-    }
-    transition->setAllowTransition(!m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
+    transition->setAllowTransition(!projectionOwnsCall() && !m_phoneSource->doNotDisturb()
+                                   && m_phoneSource->incomingCall()
                                    && !m_phoneSource->callConnected());
 }
 
@@ -87,8 +86,9 @@ void HmiPhoneGlobalStateHandler::missedCallPresentTransitionEventTest(QEvent *)
 
 void HmiPhoneGlobalStateHandler::incomingCallonPrjDisconnectTransitionEventTest(QEvent *)
 {
+    // As for a call that starts ringing: under do-not-disturb incomingCall() refuses it.
     allow(m_incomingCallOnProjectionDisconnectTransition,
-          !m_phoneSource->doNotDisturb() && m_phoneSource->incomingCall()
+          m_phoneSource->incomingCall()
                   && Mavrosk::ProjectionSource::instance()->projectionMode()
                           == ProjectionMode::None);
 }

@@ -26,10 +26,18 @@ bool eventsBlocked()
     return Mavrosk::EAPhoneSource::instance()->eventsBlocked();
 }
 
+// A call rings that the driver was shown. Under do-not-disturb none was: such a call is refused
+// at once, and the phone may still report it ringing for a moment, so the call keys keep their
+// meaning without a ringing call (a seek key seeks).
+bool ringing(const Mavrosk::PhoneSource *phone)
+{
+    return phone->incomingCall() && !phone->doNotDisturb();
+}
+
 // A second call rings while one is connected.
 bool waitingCall(const Mavrosk::PhoneSource *phone)
 {
-    return phone->incomingCall() && phone->status() == CallStatus::OneCallConnected;
+    return ringing(phone) && phone->status() == CallStatus::OneCallConnected;
 }
 
 // A call the driver may end with a key: private mode hands the call to the handset.
@@ -49,7 +57,7 @@ bool twoCalls(const Mavrosk::PhoneSource *phone)
 // used up without answering.
 bool answer(const Mavrosk::PhoneSource *phone, HmiPhoneController *controller, bool accept)
 {
-    if (!controller && (waitingCall(phone) || phone->incomingCall())) {
+    if (!controller && ringing(phone)) {
         qCWarning(hmiphone()) << "HmiPhoneGlobalStateHandler: the controller is gone, the call "
                                  "is not answered";
         return true;
@@ -59,7 +67,7 @@ bool answer(const Mavrosk::PhoneSource *phone, HmiPhoneController *controller, b
             controller->acceptWaitingCall();
         else
             controller->rejectWaitingCall();
-    } else if (phone->incomingCall()) {
+    } else if (ringing(phone)) {
         if (accept)
             controller->acceptIncomingCall();
         else
@@ -171,9 +179,9 @@ void HmiPhoneGlobalStateHandler::processSWCRejectOrSeek()
 {
     if (eventsBlocked())
         return;
-    if (m_phoneSource->incomingCall() && m_controller)
+    if (ringing(m_phoneSource) && m_controller)
         m_controller->rejectIncomingCall();
-    else if (m_phoneSource->incomingCall())
+    else if (ringing(m_phoneSource))
         qCWarning(hmiphone()) << "HmiPhoneGlobalStateHandler: the controller is gone, the call "
                                  "is not rejected";
     else if (callActivity(m_phoneSource))

@@ -9,7 +9,9 @@
 #include "hmiphoneintegration.h"
 #include "hmiphonenumbers.h"
 #include "hmiphonepopupmanager.h"
+#include "hmiphoneviews.h"
 
+#include <brisken/viewcontroller.h>
 #include <mavrosk/bluetoothsource.h>
 #include <mavrosk/phonesource.h>
 #include <quorvel/popupstate.h>
@@ -172,19 +174,34 @@ void HmiPhoneGlobalStateHandler::handleVRSendReplyMessage()
     m_popupManager->showSendTextMessage();
 }
 
+// Every failure popup of a send closes before the next send goes out (or once a send went
+// through): none of them closes by itself, and the retry button of one left open, covered, would
+// send again a text that already went.
+void HmiPhoneGlobalStateHandler::hideSendFailures()
+{
+    m_popupManager->hideSendTextMessageFailure();
+    for (const QString *view : {&Views::PhoneSmsSendTextMessageNetworkFailure,
+                                &Views::PhoneSmsRetrySendTextMessageFailure,
+                                &Views::PhoneSmsSendTextMessageNoResponseFromPhone})
+        m_viewController->dismissPopup(*view);
+}
+
+// A new message starts with no retries made.
 void HmiPhoneGlobalStateHandler::handleSendTextMessageRequest()
 {
     m_popupManager->hideSendTextMessage();
+    hideSendFailures();
+    m_sendMessageRetryCount = 0;
     m_phoneSource->initiateSendTextMessage();
     m_popupManager->showSendTextMessageProgress();
     m_phoneSource->setSendMessagePhoneSendReportStatus(false);
 }
 
-// Two retries resend; the third request ends the cycle with the final failure popup, and the next
-// failure starts counting again.
+// Two retries of a message resend; the third request ends the cycle with the final failure popup,
+// and the next failure starts counting again.
 void HmiPhoneGlobalStateHandler::handleRetrySendTextMessage()
 {
-    m_popupManager->hideSendTextMessageFailure();
+    hideSendFailures();
     if (m_sendMessageRetryCount >= SendRetries) {
         m_popupManager->showRetrySendMessageFailure();
         m_sendMessageRetryCount = 0;
@@ -200,8 +217,10 @@ void HmiPhoneGlobalStateHandler::handleRetrySendTextMessage()
 
 void HmiPhoneGlobalStateHandler::handleSendTextMessageSuccess()
 {
-    if (closeSendProgress(m_phoneSource, m_popupManager))
+    if (closeSendProgress(m_phoneSource, m_popupManager)) {
+        hideSendFailures();
         m_popupManager->showSendTextMessageSuccess();
+    }
 }
 
 void HmiPhoneGlobalStateHandler::handleSendTextMessageFailure()
