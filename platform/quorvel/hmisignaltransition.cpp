@@ -1,6 +1,8 @@
 #include "hmisignaltransition.h"
 
+#include <QHash>
 #include <QLoggingCategory>
+#include <QPair>
 
 Q_DECLARE_LOGGING_CATEGORY(quorvelLog)
 
@@ -8,16 +10,25 @@ namespace Quorvel {
 
 namespace {
 
+// A module names its signals by the same few signatures many times (every key row names
+// "keyEvent(int, int)"): each is normalized and looked up once per sender class.
 QMetaMethod signalFor(const QObject *sender, const char *signal)
 {
     if (!sender || !signal)
         return QMetaMethod();
-    QByteArray signature(signal);
-    if (signature.startsWith('2'))
-        signature.remove(0, 1);
-    signature = QMetaObject::normalizedSignature(signature.constData());
-    const int index = sender->metaObject()->indexOfSignal(signature.constData());
-    return index < 0 ? QMetaMethod() : sender->metaObject()->method(index);
+    static QHash<QPair<const QMetaObject *, QByteArray>, int> known;
+    const QMetaObject *meta = sender->metaObject();
+    const QByteArray written = QByteArray::fromRawData(signal, int(qstrlen(signal)));
+    auto found = known.constFind(qMakePair(meta, written));
+    if (found == known.constEnd()) {
+        QByteArray signature(written.constData(), written.size());
+        if (signature.startsWith('2'))
+            signature.remove(0, 1);
+        signature = QMetaObject::normalizedSignature(signature.constData());
+        found = known.insert(qMakePair(meta, QByteArray(signal)),
+                             meta->indexOfSignal(signature.constData()));
+    }
+    return found.value() < 0 ? QMetaMethod() : meta->method(found.value());
 }
 
 } // namespace

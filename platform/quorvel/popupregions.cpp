@@ -1,5 +1,6 @@
 #include "statemachine_p.h"
 
+#include "hmilayeredstate.h"
 #include "popupstate.h"
 
 #include <journal/journal.h>
@@ -303,10 +304,9 @@ void StateMachinePrivate::regionExited(PopupRegion *region)
 void StateMachinePrivate::registerPopup(PopupState *popup)
 {
     popupsById[popup->viewId()].append(popup);
-    // A popup made with a layer is made in the layer's region; a global one gets its region
-    // when the host installs it.
-    if (auto *region = dynamic_cast<PopupRegion *>(popup->parent()))
-        setHomeRegion(popup, region);
+    // A global popup gets its region when the host installs it.
+    if (HmiLayeredState *layer = popup->layer())
+        popup->m_home = layer->layerState();
 }
 
 void StateMachinePrivate::forgetPopup(PopupState *popup)

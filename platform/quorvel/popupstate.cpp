@@ -13,7 +13,7 @@ PopupState::PopupState(const QString &viewId, int priority)
 { }
 
 PopupState::PopupState(const QString &viewId, HmiLayeredState *layer, int priority)
-    : HmiState(viewId, layer ? layer->layerState() : nullptr)
+    : HmiState(viewId, StateMachinePrivate::get()->homeParent(layer))
     , m_priority(priority)
     , m_layer(layer)
 {

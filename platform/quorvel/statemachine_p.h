@@ -16,6 +16,7 @@
 namespace Quorvel {
 
 class HmiAbstractTransition;
+class HmiLayeredState;
 class HmiViewState;
 class NamedState;
 class PopupRegion;
@@ -294,6 +295,9 @@ public:
     bool leavesClosingToFramework(const PopupState *popup) const;
     void closeAnsweredPopup(const QString &viewId);
     void checkPopupInvariants() const;
+    // Where a popup waits when it is made: a layer's popup closed in the parking state, a global
+    // one without a parent until the host installs it.
+    QState *homeParent(HmiLayeredState *layer) const { return layer ? popupParking : nullptr; }
     void registerPopup(PopupState *popup);
     void forgetPopup(PopupState *popup);
     PopupState *popupFor(const QString &viewId) const;
