@@ -124,8 +124,21 @@ bool StateMachinePrivate::listenToSignal(HmiAbstractTransition *transition, cons
         relays.insert(key, relay);
         QMetaObject::connect(sender, signalIndex, relay, QObject::staticMetaObject.methodCount(),
                              Qt::DirectConnection, nullptr);
-        QObject::connect(sender, &QObject::destroyed, relay,
-                         [this, key] { delete relays.take(key); });
+        // One watch per sender: its relays go with it.
+        if (!watchedSenders.contains(sender)) {
+            watchedSenders.insert(sender);
+            QObject::connect(sender, &QObject::destroyed, &senderWatch, [this, sender] {
+                watchedSenders.remove(sender);
+                for (auto it = relays.begin(); it != relays.end();) {
+                    if (it.key().first == sender) {
+                        delete it.value();
+                        it = relays.erase(it);
+                    } else {
+                        ++it;
+                    }
+                }
+            });
+        }
     }
     relay->listeners.append(transition);
     return true;

@@ -47,8 +47,16 @@ HmiSignalTransition::HmiSignalTransition(const QObject *sender, const QMetaMetho
 {
     if (signal.isValid() && signal.methodType() == QMetaMethod::Signal && sender
         && listenToSignal(sender, signal.methodIndex())) {
-        m_signal = signal.methodSignature();
-        setObjectName(QString::fromLatin1(m_signal));
+        // Many transitions listen to the same signal: its signature and name are made once.
+        static QHash<QPair<const QMetaObject *, int>, QPair<QByteArray, QString>> names;
+        const auto key = qMakePair(signal.enclosingMetaObject(), signal.methodIndex());
+        auto name = names.constFind(key);
+        if (name == names.constEnd()) {
+            const QByteArray signature = signal.methodSignature();
+            name = names.insert(key, qMakePair(signature, QString::fromLatin1(signature)));
+        }
+        m_signal = name->first;
+        setObjectName(name->second);
     }
 }
 

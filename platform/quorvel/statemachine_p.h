@@ -331,6 +331,9 @@ public:
 
     QHash<QString, QVector<HmiAbstractTransition *>> eventListeners;
     QHash<QPair<const QObject *, int>, SignalRelay *> relays;
+    // The senders whose destruction removes their relays; the watch ends with this object.
+    QSet<const QObject *> watchedSenders;
+    QObject senderWatch;
     QHash<QString, QVector<NamedState *>> names;
 
     QPointer<HmiViewState> activeView;
