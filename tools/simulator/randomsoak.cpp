@@ -221,14 +221,26 @@ QString RandomSoak::emitSignal()
     return line({{QStringLiteral("emit"), signal.name}, {QStringLiteral("args"), args}});
 }
 
-QString RandomSoak::callSlot()
+QJsonObject RandomSoak::slotCall()
 {
     const Member &slot = m_slots.at(pick(m_slots.size()));
     const bool wrong = chance(10);
     QJsonArray args;
     for (int type : slot.types)
         args.append(valueOf(type, wrong && chance(50)));
-    return line({{QStringLiteral("call"), slot.name}, {QStringLiteral("args"), args}});
+    return {{QStringLiteral("call"), slot.name}, {QStringLiteral("args"), args}};
+}
+
+// The driver answers one of the popups open (on top or covered) with a button's call, or with
+// its plain close button.
+QString RandomSoak::answerPopup()
+{
+    const QStringList open = Quorvel::StateMachine::instance()->openPopups();
+    if (open.isEmpty())
+        return line(slotCall());
+    QJsonObject step = chance(70) ? slotCall() : QJsonObject();
+    step.insert(QStringLiteral("answer"), open.at(pick(open.size())));
+    return line(step);
 }
 
 QString RandomSoak::modelStep()
@@ -277,7 +289,7 @@ QString RandomSoak::nextStep()
                      {QStringLiteral("args"), QJsonArray{key, kind}}});
     }
     if (roll < 70 && !m_slots.isEmpty())
-        return callSlot();
+        return chance(15) ? answerPopup() : line(slotCall());
     if (roll < 74) {
         const int action = chance(80) ? Actions[pick(8)] : intValue().toInt();
         QJsonArray args;

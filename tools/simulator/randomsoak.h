@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QJsonObject>
 #include <QList>
 #include <QRandomGenerator>
 #include <QString>
@@ -46,7 +47,8 @@ private:
     QJsonValue valueOf(int type, bool wrong);
     QString setBridgeValue();
     QString emitSignal();
-    QString callSlot();
+    QJsonObject slotCall();
+    QString answerPopup();
     QString modelStep();
     int pick(int count) { return int(m_random.bounded(quint32(count))); }
     bool chance(int percent) { return pick(100) < percent; }
