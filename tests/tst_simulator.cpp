@@ -32,10 +32,10 @@ void SimulatorTest::scenarioFile_data()
     QTest::addColumn<QByteArray>("input"); // standard input
     QTest::addColumn<int>("exitCode");
     QTest::addColumn<QString>("message"); // stdout or stderr contains it
-    QTest::addColumn<QString>("platform"); // Qt's platform plug-in
+    QTest::addColumn<QString>("platform"); // Qt's platform plug-in (minimal leaves nothing behind)
     const auto row = [](const char *tag, const QStringList &options, const QByteArray &scenario,
                         const QByteArray &input, int exitCode, const QString &message,
-                        const QString &platform = QStringLiteral("offscreen")) {
+                        const QString &platform = QStringLiteral("minimal")) {
         QTest::newRow(tag) << options << scenario << input << exitCode << message << platform;
     };
 
