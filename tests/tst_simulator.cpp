@@ -3,11 +3,15 @@
 
 #include "testsupport.h"
 
+#include <carkeys.h>
+
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QProcess>
 #include <QTemporaryDir>
 #include <QtTest>
+
+#include <iterator>
 
 class SimulatorTest : public TestSupport::Suite
 {
@@ -15,6 +19,7 @@ class SimulatorTest : public TestSupport::Suite
 private slots:
     void scenarioFile_data();
     void scenarioFile();
+    void carKeysInReadme();
 
 private:
     QTemporaryDir m_dir;
@@ -27,9 +32,11 @@ void SimulatorTest::scenarioFile_data()
     QTest::addColumn<QByteArray>("input"); // standard input
     QTest::addColumn<int>("exitCode");
     QTest::addColumn<QString>("message"); // stdout or stderr contains it
+    QTest::addColumn<QString>("platform"); // Qt's platform plug-in (minimal leaves nothing behind)
     const auto row = [](const char *tag, const QStringList &options, const QByteArray &scenario,
-                        const QByteArray &input, int exitCode, const QString &message) {
-        QTest::newRow(tag) << options << scenario << input << exitCode << message;
+                        const QByteArray &input, int exitCode, const QString &message,
+                        const QString &platform = QStringLiteral("minimal")) {
+        QTest::newRow(tag) << options << scenario << input << exitCode << message << platform;
     };
 
     // Refused before anything runs: exit 2, the line named. Line 1 of each scenario is a valid
@@ -162,9 +169,8 @@ void SimulatorTest::scenarioFile_data()
         QStringLiteral("--random checks the invariants anyway"));
     // Without a display (no X server, the offscreen platform not chosen) or without the window
     // built in, --window says so and exits 2 instead of aborting.
-    row("window without a display",
-        {QStringLiteral("--window"), QStringLiteral("-platform"), QStringLiteral("xcb")}, {}, {}, 2,
-        QStringLiteral("--window"));
+    row("window without a display", {QStringLiteral("--window")}, {}, {}, 2,
+        QStringLiteral("--window"), QStringLiteral("xcb"));
 }
 
 void SimulatorTest::scenarioFile()
@@ -174,6 +180,7 @@ void SimulatorTest::scenarioFile()
     QFETCH(QByteArray, input);
     QFETCH(int, exitCode);
     QFETCH(QString, message);
+    QFETCH(QString, platform);
 
     QVERIFY(m_dir.isValid());
     QStringList arguments = QStringList{QStringLiteral("--log"), QStringLiteral("none")} + options;
@@ -190,7 +197,7 @@ void SimulatorTest::scenarioFile()
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
     environment.remove(QStringLiteral("DISPLAY"));
     environment.remove(QStringLiteral("WAYLAND_DISPLAY"));
-    environment.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("offscreen"));
+    environment.insert(QStringLiteral("QT_QPA_PLATFORM"), platform);
     simulator.setProcessEnvironment(environment);
     simulator.start(QStringLiteral(HMIPHONE_SIM_FILE), arguments);
     QVERIFY(simulator.waitForStarted());
@@ -212,6 +219,29 @@ void SimulatorTest::scenarioFile()
         QCOMPARE(summary.value(QLatin1String("out")).toString(), QStringLiteral("summary"));
         QCOMPARE(summary.value(QLatin1String("failures")).toInt() > 0, exitCode == 1);
     }
+}
+
+// The README lists the keys that the reader accepts and the window shows: the same table.
+void SimulatorTest::carKeysInReadme()
+{
+    QFile readme(QStringLiteral(HMIPHONE_README_FILE));
+    QVERIFY(readme.open(QIODevice::ReadOnly | QIODevice::Text));
+    const QString text = QString::fromUtf8(readme.readAll());
+    const QString table = text.section(QStringLiteral("<!-- car-keys -->\n"), 1)
+                                  .section(QStringLiteral("\n\n"), 0, 0);
+    QStringList listed;
+    const QStringList lines = table.split(QLatin1Char('\n')).mid(2);
+    for (const QString &line : lines)
+        listed.append(line.section(QLatin1Char('|'), 1, 2).simplified());
+    QStringList known;
+    for (const Simulator::CarKey &key : Simulator::CarKeys)
+        known.append(QStringLiteral("%1 | %2").arg(key.code).arg(QLatin1String(key.meaning)));
+    QCOMPARE(listed, known);
+
+    QStringList kinds;
+    for (int i = 0; i < int(std::size(Simulator::KeyKinds)); ++i)
+        kinds.append(QStringLiteral("%1 %2").arg(i + 1).arg(QLatin1String(Simulator::KeyKinds[i])));
+    QVERIFY(text.contains(QStringLiteral("Kinds: %1.").arg(kinds.join(QStringLiteral(", ")))));
 }
 
 QTEST_GUILESS_MAIN(SimulatorTest)
