@@ -33,8 +33,18 @@ set(CPACK_DEBIAN_ENABLE_COMPONENT_DEPENDS ON)
 set(CPACK_DEBIAN_MODULE_PACKAGE_NAME hmiphone)
 set(CPACK_DEBIAN_SIMULATOR_PACKAGE_NAME hmiphone-sim)
 # The module's platform libraries are the host's, not a Debian package's: dpkg-shlibdeps finds the
-# stand-ins built here and leaves them out of the dependencies.
+# stand-ins built here (or the host's) and leaves out of the dependencies those that no Debian
+# package installed.
+# On the host's libraries, they come from wherever their packages lie.
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS "${CMAKE_LIBRARY_OUTPUT_DIRECTORY}")
+foreach(library Platform::quorvel Platform::brisken Platform::taldris Platform::mavrosk)
+    get_target_property(imported ${library} IMPORTED)
+    if(imported)
+        get_target_property(location ${library} LOCATION)
+        get_filename_component(folder "${location}" DIRECTORY)
+        list(APPEND CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS "${folder}")
+    endif()
+endforeach()
 if(HMIPHONE_BUILD_WINDOW)
     # The window's pages import QtQuick 2 at run time.
     set(CPACK_DEBIAN_SIMULATOR_PACKAGE_DEPENDS qml-module-qtquick2)
