@@ -49,6 +49,8 @@ private slots:
         QCOMPARE(metaData.value(QLatin1String("Name")).toString(), QStringLiteral("HmiPhone"));
         QCOMPARE(metaData.value(QLatin1String("Description")).toString(),
                  QStringLiteral("Phone module plugin"));
+        QCOMPARE(metaData.value(QLatin1String("Version")).toString(),
+                 QStringLiteral(HMIPHONE_VERSION));
 
         QObject *instance = loader.instance();
         QVERIFY2(instance, qPrintable(loader.errorString()));

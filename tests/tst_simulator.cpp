@@ -157,7 +157,8 @@ void SimulatorTest::scenarioFile_data()
     // The command line: 2 for what cannot run, options that would do nothing refused.
     row("unknown option", {QStringLiteral("--frobnicate")}, open, {}, 2,
         QStringLiteral("Unknown option 'frobnicate'"));
-    row("version", {QStringLiteral("--version")}, {}, {}, 0, QStringLiteral("hmiphone-sim 1.0"));
+    row("version", {QStringLiteral("--version")}, {}, {}, 0,
+        QStringLiteral("hmiphone-sim " HMIPHONE_VERSION "\n"));
     row("steps without random", {QStringLiteral("--steps"), QStringLiteral("5")}, open, {}, 2,
         QStringLiteral("--steps goes with --random"));
     row("write-scenario without random", {QStringLiteral("--write-scenario"), QStringLiteral("x")},

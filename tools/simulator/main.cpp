@@ -45,9 +45,18 @@ const QString ModuleLogCategory = QStringLiteral("orvane.hmiphone");
 
 enum ExitCode { Passed = 0, ChecksFailed = 1, CannotRun = 2 };
 
-// The plug-in built with this program; beside the program's directory when the build tree moved.
+// Installed, the plug-in installed with this program, found relative to it (the installed tree
+// may have moved); else the one built with it, beside the program's directory when the build tree
+// moved.
 QString defaultPluginFile()
 {
+#ifdef HMIPHONE_INSTALLED_PLUGIN
+    const QString installed
+            = QDir::cleanPath(QDir(QCoreApplication::applicationDirPath())
+                                      .filePath(QStringLiteral(HMIPHONE_INSTALLED_PLUGIN)));
+    if (QFileInfo::exists(installed))
+        return installed;
+#endif
     const QString built = QString::fromUtf8(HMIPHONE_PLUGIN_FILE);
     if (!built.isEmpty() && QFileInfo::exists(built))
         return built;
