@@ -3,11 +3,15 @@
 
 #include "testsupport.h"
 
+#include <carkeys.h>
+
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QProcess>
 #include <QTemporaryDir>
 #include <QtTest>
+
+#include <iterator>
 
 class SimulatorTest : public TestSupport::Suite
 {
@@ -15,6 +19,7 @@ class SimulatorTest : public TestSupport::Suite
 private slots:
     void scenarioFile_data();
     void scenarioFile();
+    void carKeysInReadme();
 
 private:
     QTemporaryDir m_dir;
@@ -212,6 +217,29 @@ void SimulatorTest::scenarioFile()
         QCOMPARE(summary.value(QLatin1String("out")).toString(), QStringLiteral("summary"));
         QCOMPARE(summary.value(QLatin1String("failures")).toInt() > 0, exitCode == 1);
     }
+}
+
+// The README lists the keys that the reader accepts and the window shows: the same table.
+void SimulatorTest::carKeysInReadme()
+{
+    QFile readme(QStringLiteral(HMIPHONE_README_FILE));
+    QVERIFY(readme.open(QIODevice::ReadOnly | QIODevice::Text));
+    const QString text = QString::fromUtf8(readme.readAll());
+    const QString table = text.section(QStringLiteral("<!-- car-keys -->\n"), 1)
+                                  .section(QStringLiteral("\n\n"), 0, 0);
+    QStringList listed;
+    const QStringList lines = table.split(QLatin1Char('\n')).mid(2);
+    for (const QString &line : lines)
+        listed.append(line.section(QLatin1Char('|'), 1, 2).simplified());
+    QStringList known;
+    for (const Simulator::CarKey &key : Simulator::CarKeys)
+        known.append(QStringLiteral("%1 | %2").arg(key.code).arg(QLatin1String(key.meaning)));
+    QCOMPARE(listed, known);
+
+    QStringList kinds;
+    for (int i = 0; i < int(std::size(Simulator::KeyKinds)); ++i)
+        kinds.append(QStringLiteral("%1 %2").arg(i + 1).arg(QLatin1String(Simulator::KeyKinds[i])));
+    QVERIFY(text.contains(QStringLiteral("Kinds: %1.").arg(kinds.join(QStringLiteral(", ")))));
 }
 
 QTEST_GUILESS_MAIN(SimulatorTest)

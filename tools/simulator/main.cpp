@@ -261,10 +261,10 @@ int main(int argc, char *argv[])
         printError(parser.errorText() + QStringLiteral(" (see --help)"));
         return CannotRun;
     }
-    if (parser.isSet(helpOption))
-        parser.showHelp(Passed);
-    if (parser.isSet(versionOption))
-        parser.showVersion();
+    // Help and version: Qt's own texts, exit 0.
+    if (parser.isSet(helpOption) || parser.isSet(QStringLiteral("help-all"))
+        || parser.isSet(versionOption))
+        parser.process(app);
 
     const bool interactive = parser.isSet(interactiveOption);
     const bool random = parser.isSet(randomOption);

@@ -117,9 +117,7 @@ void OutputWriter::write(const QString &kind, const QVariantMap &fields)
     const QString human
             = QStringLiteral("%1  %2 %3").arg(seconds, 9).arg(kind, -15).arg(details(output));
     const QString line = m_format == Json ? toJsonLine(output) : human;
-    std::fputs(line.toUtf8().constData(), m_stream);
-    std::fputc('\n', m_stream);
-    std::fflush(m_stream);
+    putLine(line);
     emit written(human);
 }
 
@@ -130,9 +128,7 @@ void OutputWriter::note(const QString &text)
     emit written(text);
     if (m_format != Human)
         return;
-    std::fputs(text.toUtf8().constData(), m_stream);
-    std::fputc('\n', m_stream);
-    std::fflush(m_stream);
+    putLine(text);
 }
 
 void OutputWriter::echoStep(int line, const QString &text)
@@ -154,7 +150,11 @@ void OutputWriter::record(const QString &kind, const QVariantMap &fields)
 {
     if (m_format != Json || m_silent)
         return;
-    const QString line = toJsonLine({m_clock ? m_clock->now() : 0, kind, fields});
+    putLine(toJsonLine({m_clock ? m_clock->now() : 0, kind, fields}));
+}
+
+void OutputWriter::putLine(const QString &line)
+{
     std::fputs(line.toUtf8().constData(), m_stream);
     std::fputc('\n', m_stream);
     std::fflush(m_stream);

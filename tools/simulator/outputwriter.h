@@ -74,6 +74,7 @@ signals:
     void written(const QString &line);
 
 private:
+    void putLine(const QString &line);
     void onJournalEntry(const Platform::JournalEntry &entry);
     static void messageHandler(QtMsgType type, const QMessageLogContext &context,
                                const QString &message);

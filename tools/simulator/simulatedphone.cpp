@@ -51,7 +51,10 @@ constexpr int MessagesRunning = 2;
 constexpr int MessagesFinished = 3;
 
 // The morning the phone's clock shows when the simulation starts.
-const QDateTime Morning(QDate(2024, 5, 14), QTime(9, 30), Qt::UTC);
+QDateTime morning()
+{
+    return QDateTime(QDate(2024, 5, 14), QTime(9, 30), Qt::UTC);
+}
 
 const char *const FirstNames[]
         = {"Anna", "Ben",   "Clara", "David", "Emma", "Felix",  "Greta", "Hugo",
@@ -125,13 +128,13 @@ SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent)
                 ? Entry{QString(), fictionalNumber(ContactCount + i), {}, 0, {}, true}
                 : m_contacts.at((i * 5) % ContactCount);
         call.type = CallTypes[i % int(std::size(CallTypes))];
-        call.time = Morning.addSecs(-60LL * (i * 97 + 13));
+        call.time = morning().addSecs(-60LL * (i * 97 + 13));
         m_calls.append(call);
     }
     for (int i = 0; i < MessageCount; ++i) {
         Entry message = m_contacts.at((i * 7 + 3) % ContactCount);
         message.text = QLatin1String(Texts[i % int(std::size(Texts))]);
-        message.time = Morning.addSecs(-60LL * (i * 131 + 5));
+        message.time = morning().addSecs(-60LL * (i * 131 + 5));
         message.read = i >= 3;
         m_messages.append(message);
     }
@@ -164,7 +167,7 @@ void SimulatedPhone::connectPhone()
 
 QDateTime SimulatedPhone::now() const
 {
-    return Morning.addMSecs(m_clock ? m_clock->now() : 0);
+    return morning().addMSecs(m_clock ? m_clock->now() : 0);
 }
 
 void SimulatedPhone::onJournalEntry(const Platform::JournalEntry &entry)
