@@ -24,6 +24,7 @@
 #include <QDirIterator>
 #include <QFile>
 #include <QGuiApplication>
+#include <QProcess>
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QTemporaryDir>
@@ -188,6 +189,8 @@ private slots:
     void viewShowsThePhonesData();
     void germanReplacesEveryText();
     void editedFileIsDrawnAgain();
+    void galleryPictureIsDrawnAlike_data();
+    void galleryPictureIsDrawnAlike();
 
 private:
     void tearDown() override;
@@ -197,6 +200,8 @@ private:
     void connectSimulatedPhone();
 
     QScopedPointer<Simulator::SimulatedPhone> m_phone;
+    // The pictures --screenshots writes of each story, by story.
+    QTemporaryDir m_screenshots;
 
     Simulator::VirtualEventDispatcher *m_clock = nullptr;
     FILE *m_traceFile = nullptr;
@@ -586,6 +591,68 @@ void TestSimWindow::editedFileIsDrawnAgain()
     // Nothing changed since: nothing is drawn again.
     m_clock->advance(2 * Simulator::QmlFolder::CheckInterval);
     QCOMPARE(reloaded.count(), 1);
+}
+
+void TestSimWindow::galleryPictureIsDrawnAlike_data()
+{
+    // docs/gallery holds pictures of the example stories, named "<story>-<line>.png" after the
+    // step that drew them.
+    QTest::addColumn<QString>("picture");
+    const QStringList pictures = QDir(QStringLiteral(HMIPHONE_GALLERY_DIR))
+                                         .entryList({QStringLiteral("*.png")}, QDir::Files);
+    QVERIFY(pictures.size() >= 3);
+    for (const QString &picture : pictures)
+        QTest::newRow(qPrintable(picture)) << picture;
+}
+
+void TestSimWindow::galleryPictureIsDrawnAlike()
+{
+    QFETCH(QString, picture);
+    const QString story = picture.section(QLatin1Char('-'), 0, -2);
+    const QString line = picture.section(QLatin1Char('-'), -1);
+    const QString shots = QDir(m_screenshots.path()).filePath(story);
+    if (!QFileInfo::exists(shots)) {
+        // As CI draws them: the simulator plays the story off screen, in English.
+        QStringList arguments{QStringLiteral("--lang"), QStringLiteral("en"),
+                              QStringLiteral("--screenshots"), shots,
+                              QStringLiteral(HMIPHONE_EXAMPLES_DIR "/") + story
+                                      + QStringLiteral(".jsonl")};
+        if (story.startsWith(QLatin1String("simulated-")))
+            arguments.prepend(QStringLiteral("--phone=simulated"));
+        QProcess simulator;
+        simulator.start(QStringLiteral(HMIPHONE_SIM_FILE), arguments);
+        QVERIFY(simulator.waitForFinished(30000));
+        QCOMPARE(simulator.exitCode(), 0);
+    }
+    const QImage drawn(QDir(shots).filePath(line));
+    const QImage expected(QDir(QStringLiteral(HMIPHONE_GALLERY_DIR)).filePath(picture));
+    QVERIFY2(!drawn.isNull(),
+             qPrintable(QStringLiteral("%1 draws no picture at line %2").arg(story, line)));
+    QCOMPARE(drawn.size(), expected.size());
+    // Alike within what fonts and rounding may move: few pixels differ, none by much.
+    const QImage a = drawn.convertToFormat(QImage::Format_RGB32);
+    const QImage b = expected.convertToFormat(QImage::Format_RGB32);
+    int differing = 0;
+    for (int y = 0; y < a.height(); ++y) {
+        const auto *rowA = reinterpret_cast<const QRgb *>(a.constScanLine(y));
+        const auto *rowB = reinterpret_cast<const QRgb *>(b.constScanLine(y));
+        for (int x = 0; x < a.width(); ++x) {
+            const int difference = qMax(qAbs(qRed(rowA[x]) - qRed(rowB[x])),
+                                        qMax(qAbs(qGreen(rowA[x]) - qGreen(rowB[x])),
+                                             qAbs(qBlue(rowA[x]) - qBlue(rowB[x]))));
+            differing += difference > 32;
+        }
+    }
+    const int allowed = a.width() * a.height() / 500;
+    if (differing > allowed) {
+        const QString kept = QDir::current().absoluteFilePath(QStringLiteral("gallery-") + picture);
+        drawn.save(kept);
+        QFAIL(qPrintable(QStringLiteral("%1 pixels differ (at most %2): the story draws %3; if the "
+                                        "change is meant, copy it to docs/gallery/%4")
+                                 .arg(differing)
+                                 .arg(allowed)
+                                 .arg(kept, picture)));
+    }
 }
 
 int main(int argc, char *argv[])

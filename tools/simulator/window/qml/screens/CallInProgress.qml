@@ -18,7 +18,9 @@ Page {
         spacing: 24
         Repeater {
             model: page.phone.callList()
+            // The calls in progress; one that rings has its popup.
             CallerLine {
+                visible: callState !== "incoming" && callState !== "waiting"
                 width: parent.width
                 fontSize: callState === "held" ? 30 : 44
                 opacity: callState === "held" ? 0.7 : 1
