@@ -68,6 +68,7 @@ Item {
             Button {
                 required property var modelData
                 width: Math.min(implicitWidth, (frame.width - 48) / frame.actions.length - 16)
+                fontSize: frame.actions.length > 4 ? 22 : 26
                 text: modelData.text
                 slot: modelData.call || "close"
                 tint: modelData.tint === "accept" ? Theme.accept

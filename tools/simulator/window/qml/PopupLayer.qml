@@ -25,7 +25,7 @@ Item {
             property bool isTop: modelData.top
             objectName: "popup:" + modelData.name
 
-            width: 800
+            width: 860
             height: 380
             x: (popupLayer.width - width) / 2 - stackDepth * 36
             y: (popupLayer.height - height) / 2 - stackDepth * 36

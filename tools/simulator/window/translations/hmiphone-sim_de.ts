@@ -33,20 +33,16 @@
 <context>
     <name>CallInProgress</name>
     <message>
-        <source>Call</source>
-        <translation>Anrufen</translation>
-    </message>
-    <message>
         <source>Two calls</source>
         <translation>Zwei Anrufe</translation>
     </message>
     <message>
         <source>Muted</source>
-        <translation>Stumm</translation>
+        <translation>Stumm an</translation>
     </message>
     <message>
         <source>Mute</source>
-        <translation>Stummschalten</translation>
+        <translation>Stumm</translation>
     </message>
     <message>
         <source>Handset</source>
@@ -62,7 +58,7 @@
     </message>
     <message>
         <source>Join</source>
-        <translation>Zusammenführen</translation>
+        <translation>Konferenz</translation>
     </message>
     <message>
         <source>End call</source>
@@ -71,6 +67,12 @@
     <message>
         <source>Unknown</source>
         <translation>Unbekannt</translation>
+    </message>
+    <message>
+        <source>Call</source>
+        <comment>screen</comment>
+        <extracomment>The title of the screen of a call in progress.</extracomment>
+        <translation>Anruf</translation>
     </message>
 </context>
 <context>
@@ -918,10 +920,6 @@
 <context>
     <name>PhoneSmsReplyView</name>
     <message>
-        <source>Reply</source>
-        <translation>Antworten</translation>
-    </message>
-    <message>
         <source>to %1</source>
         <translation>an %1</translation>
     </message>
@@ -932,6 +930,12 @@
     <message>
         <source>Send</source>
         <translation>Senden</translation>
+    </message>
+    <message>
+        <source>Reply</source>
+        <comment>screen</comment>
+        <extracomment>The title of the screen of the replies to choose from.</extracomment>
+        <translation>Antwort</translation>
     </message>
 </context>
 <context>

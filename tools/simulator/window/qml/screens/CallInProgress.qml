@@ -8,7 +8,8 @@ Page {
     id: page
     readonly property var phone: _hmiphoneController.phoneSource
 
-    title: qsTr("Call")
+    //: The title of the screen of a call in progress.
+    title: qsTr("Call", "screen")
     subtitle: page.phone.multipleCallsConnected ? qsTr("Two calls") : ""
 
     Column {

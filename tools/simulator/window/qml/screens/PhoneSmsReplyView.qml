@@ -8,7 +8,8 @@ Page {
     id: page
     readonly property var phone: _hmiphoneController.phoneSource
 
-    title: qsTr("Reply")
+    //: The title of the screen of the replies to choose from.
+    title: qsTr("Reply", "screen")
     subtitle: qsTr("to %1").arg(Format.who(phone.textMessageSenderName,
                                           phone.textMessageSenderNumber))
 
