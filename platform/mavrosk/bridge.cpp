@@ -1,5 +1,7 @@
 #include "bridge.h"
 
+#include <QMetaMethod>
+
 namespace Mavrosk {
 
 QList<DataSource *> createAll()
@@ -23,6 +25,42 @@ void resetAll()
     const QList<DataSource *> sources = createAll();
     for (DataSource *source : sources)
         source->reset();
+}
+
+QList<QPair<QString, MultiDPListModel *>> listModels()
+{
+    QList<QPair<QString, MultiDPListModel *>> models;
+    for (DataSource *source : createAll()) {
+        const QMetaObject *meta = source->metaObject();
+        for (int i = meta->methodOffset(); i < meta->methodCount(); ++i) {
+            const QMetaMethod method = meta->method(i);
+            const QMetaType type(method.returnType());
+            if (method.methodType() != QMetaMethod::Method || method.parameterCount() != 0
+                || !type.metaObject()
+                || !type.metaObject()->inherits(&MultiDPListModel::staticMetaObject))
+                continue;
+            MultiDPListModel *model = nullptr;
+            // The getters return their model as its own type; read it through the base.
+            void *result = nullptr;
+            QGenericReturnArgument returned(method.typeName(), &result);
+            if (method.invoke(source, Qt::DirectConnection, returned))
+                model = static_cast<MultiDPListModel *>(result);
+            if (model)
+                models.append({source->shortName() + QLatin1Char('.')
+                                       + QString::fromLatin1(method.name()),
+                               model});
+        }
+    }
+    return models;
+}
+
+MultiDPListModel *listModel(const QString &name)
+{
+    for (const auto &model : listModels()) {
+        if (model.first == name)
+            return model.second;
+    }
+    return nullptr;
 }
 
 } // namespace Mavrosk

@@ -23,14 +23,16 @@
 // PhoneSource ("phone")
 //   call      int status (0 no call, 1 failure, 3-6 dialling, 7 one call, 9/10 two calls,
 //             11 refusing a further call, 12 standby); bool incomingCall, callConnected,
-//             dialingInProgress, multipleCallsConnected, privateMode, doNotDisturb, roaming;
+//             dialingInProgress, multipleCallsConnected, privateMode, muted, doNotDisturb, roaming;
 //             int emergencyCallStatus; int deviceBatteryLevel = -1 (none known);
 //             bool siriSupported, siriEnabled, siriActive, phoneVoiceServiceActive;
 //             int currentExtendedMode [currentExtendedModeChanged(int)], extendedModeTimerValue
 //             (minutes); QString callNumberEntered (m) [callNumberEnteredChanged(const QString&)],
 //             dtmfNumberEntered (m, setDTMFNumberEntered); bool outboundRoamingCallIsFromRecentList
 //             (m); int outboundRoamingRecentCallType (m), outboundRoamingRecentCallIndex (m);
-//             bool phoneCallStandByMode (m)
+//             bool phoneCallStandByMode (m); MultiDPListModel *callList() (roles "name",
+//             "number", "callState" "incoming"/"waiting"/"dialing"/"active"/"held", "duration" in
+//             seconds: the calls the phone has now)
 //   settings  bool roamingWarning (m), lowBatteryNotification (m), muteAudioInPrivacy (m),
 //             automaticContactDownload (m); int phoneRingtone (m), messageNotification (m),
 //             contactSortOrder (m)
@@ -46,12 +48,14 @@
 //             (roles "name", "number", "type", "time": the list last downloaded)
 //   messages  int messagesDownloadingStatus [messagesDownloadingStatusChanged(int)] (2 running,
 //             3 finished, 4 failed); MultiDPListModel *textMessageList() (roles "name",
-//             "number", "time", "text", "read": the inbox last downloaded); bool messagesInboxEmptyStatus = true, messagesInMemoryStatus,
-//             messageNotificationEnabled, messageAccessProfileStatus,
-//             smsMessageAccessProfileAvailable, smsPhoneDeclinedAccessStatus (read
-//             getSmsPhoneDeclinedAccess()); int numOfSmsDownloadAttempts, smsTotalCount
-//             [smsTotalCountChanged(int)], totalUnreadSmsCount [totalUnreadSmsCountChanged(int)];
-//             QString textMessageBody; int listenMessageLineNo, replyMessageLineNo
+//             "number", "time", "text", "read": the inbox last downloaded); bool
+//             messagesInboxEmptyStatus = true, messagesInMemoryStatus, messageNotificationEnabled,
+//             messageAccessProfileStatus, smsMessageAccessProfileAvailable,
+//             smsPhoneDeclinedAccessStatus (read getSmsPhoneDeclinedAccess()); int
+//             numOfSmsDownloadAttempts, smsTotalCount [smsTotalCountChanged(int)],
+//             totalUnreadSmsCount [totalUnreadSmsCountChanged(int)]; QString textMessageBody,
+//             textMessageSenderName, textMessageSenderNumber (the message last detailed or
+//             alerted); int listenMessageLineNo, replyMessageLineNo
 //             [replyMessageLineNoChanged(int)] (both count from 1); QVariantList smsReplyMessages
 //             (maps with "text"); QString replyTextSelected (m); bool hearItPressed (m);
 //             int sendMessageStatus = -1 [sendMessageStatusChanged(int)] (2 sent, 0/1 failed,
@@ -89,6 +93,8 @@
 //             sendMessageNotificationEnabled(bool); clearAlertPermanently(int),
 //             clearAlertForThisCycle(int), callForFixAlert(int, QString); playRingtone(int),
 //             stopPlayRingtone(), playAlert(int)
+//   alerts    MultiDPListModel *statusAlertList() (roles "alertId", "supportPhoneNumber": the
+//             status alerts not cleared)
 // BluetoothSource ("bluetooth")
 //             bool deviceConnected [deviceConnectedChanged(bool)]; int phoneDevice = -1
 //             [phoneDeviceChanged(int)], selectedDevice = -1, deviceListCount,
@@ -121,5 +127,11 @@ QList<DataSource *> createAll();
 
 // Puts every source and list model back to the values of a head unit with no phone.
 void resetAll();
+
+// The list models the sources offer through their invokable getters, named "<source>.<getter>"
+// ("phone.phoneBook", "phone.callList", ...), in declaration order.
+QList<QPair<QString, MultiDPListModel *>> listModels();
+// One of them by name; null for a name that is none.
+MultiDPListModel *listModel(const QString &name);
 
 } // namespace Mavrosk

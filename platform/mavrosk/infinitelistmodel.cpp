@@ -6,6 +6,10 @@ InfiniteListModel::InfiniteListModel(QObject *parent)
     : MultiDPListModel(parent)
 { }
 
+InfiniteListModel::InfiniteListModel(const QStringList &roles, QObject *parent)
+    : MultiDPListModel(roles, parent)
+{ }
+
 void InfiniteListModel::setListLength(int length)
 {
     length = qMax(0, length);

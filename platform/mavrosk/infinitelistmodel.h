@@ -14,6 +14,7 @@ class InfiniteListModel : public MultiDPListModel
 
 public:
     explicit InfiniteListModel(QObject *parent = nullptr);
+    InfiniteListModel(const QStringList &roles, QObject *parent);
 
     int listLength() const { return m_listLength; }
     // Bridge side: the length of the whole list.

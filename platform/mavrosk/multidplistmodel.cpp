@@ -6,6 +6,14 @@ MultiDPListModel::MultiDPListModel(QObject *parent)
     : QAbstractListModel(parent)
 { }
 
+MultiDPListModel::MultiDPListModel(const QStringList &roles, QObject *parent)
+    : QAbstractListModel(parent)
+{
+    for (const QString &role : roles)
+        m_declaredRoles.append(role.toUtf8());
+    m_roles = m_declaredRoles;
+}
+
 QVariant MultiDPListModel::get(int row, const QString &role) const
 {
     if (row < 0 || row >= m_rows.size())
@@ -18,7 +26,7 @@ void MultiDPListModel::setRows(const QVariantList &rows)
     const int before = m_rows.size();
     beginResetModel();
     m_rows = rows;
-    m_roles.clear();
+    m_roles = m_declaredRoles;
     for (const QVariant &row : rows) {
         const QStringList keys = row.toMap().keys();
         for (const QString &key : keys) {

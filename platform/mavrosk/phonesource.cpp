@@ -4,10 +4,21 @@ namespace Mavrosk {
 
 PhoneSource::PhoneSource()
     : DataSource(QStringLiteral("phone"))
-    , m_alphabetIndexModel(new MultiDPListModel(this))
-    , m_phoneBook(new InfiniteListModel(this))
-    , m_recentCallList(new MultiDPListModel(this))
-    , m_textMessageList(new MultiDPListModel(this))
+    , m_alphabetIndexModel(new MultiDPListModel(
+              {QStringLiteral("alphabet"), QStringLiteral("letterIndex")}, this))
+    , m_phoneBook(new InfiniteListModel({QStringLiteral("name"), QStringLiteral("number")}, this))
+    , m_recentCallList(new MultiDPListModel({QStringLiteral("name"), QStringLiteral("number"),
+                                             QStringLiteral("type"), QStringLiteral("time")},
+                                            this))
+    , m_textMessageList(new MultiDPListModel({QStringLiteral("name"), QStringLiteral("number"),
+                                              QStringLiteral("time"), QStringLiteral("text"),
+                                              QStringLiteral("read")},
+                                             this))
+    , m_callList(new MultiDPListModel({QStringLiteral("name"), QStringLiteral("number"),
+                                       QStringLiteral("callState"), QStringLiteral("duration")},
+                                      this))
+    , m_statusAlertList(new MultiDPListModel(
+              {QStringLiteral("alertId"), QStringLiteral("supportPhoneNumber")}, this))
 {
     // The views call the two model getters from QML, which needs their return types by name.
     qRegisterMetaType<MultiDPListModel *>();
@@ -40,6 +51,16 @@ MultiDPListModel *PhoneSource::textMessageList() const
     return m_textMessageList;
 }
 
+MultiDPListModel *PhoneSource::callList() const
+{
+    return m_callList;
+}
+
+MultiDPListModel *PhoneSource::statusAlertList() const
+{
+    return m_statusAlertList;
+}
+
 void PhoneSource::resetModels()
 {
     m_alphabetIndexModel->setRows({});
@@ -47,6 +68,8 @@ void PhoneSource::resetModels()
     m_phoneBook->setListLength(0);
     m_recentCallList->setRows({});
     m_textMessageList->setRows({});
+    m_callList->setRows({});
+    m_statusAlertList->setRows({});
 }
 
 void PhoneSource::setStatus(int value)
@@ -77,6 +100,11 @@ void PhoneSource::setMultipleCallsConnected(bool value)
 void PhoneSource::setPrivateMode(bool value)
 {
     update(m_privateMode, value, &PhoneSource::privateModeChanged);
+}
+
+void PhoneSource::setMuted(bool value)
+{
+    update(m_muted, value, &PhoneSource::mutedChanged);
 }
 
 void PhoneSource::setEmergencyCallStatus(int value)
@@ -301,6 +329,16 @@ void PhoneSource::setTotalUnreadSmsCount(int value)
 void PhoneSource::setTextMessageBody(const QString &value)
 {
     update(m_textMessageBody, value, &PhoneSource::textMessageBodyChanged);
+}
+
+void PhoneSource::setTextMessageSenderName(const QString &value)
+{
+    update(m_textMessageSenderName, value, &PhoneSource::textMessageSenderNameChanged);
+}
+
+void PhoneSource::setTextMessageSenderNumber(const QString &value)
+{
+    update(m_textMessageSenderNumber, value, &PhoneSource::textMessageSenderNumberChanged);
 }
 
 void PhoneSource::setListenMessageLineNo(int value)

@@ -22,6 +22,7 @@ class PhoneSource : public DataSource
     Q_PROPERTY(bool multipleCallsConnected READ multipleCallsConnected WRITE
                        setMultipleCallsConnected NOTIFY multipleCallsConnectedChanged)
     Q_PROPERTY(bool privateMode READ privateMode WRITE setPrivateMode NOTIFY privateModeChanged)
+    Q_PROPERTY(bool muted READ muted WRITE setMuted NOTIFY mutedChanged)
     Q_PROPERTY(int emergencyCallStatus READ emergencyCallStatus WRITE setEmergencyCallStatus NOTIFY
                        emergencyCallStatusChanged)
     Q_PROPERTY(bool doNotDisturb READ doNotDisturb WRITE setDoNotDisturb NOTIFY doNotDisturbChanged)
@@ -103,6 +104,10 @@ class PhoneSource : public DataSource
                        totalUnreadSmsCountChanged)
     Q_PROPERTY(QString textMessageBody READ textMessageBody WRITE setTextMessageBody NOTIFY
                        textMessageBodyChanged)
+    Q_PROPERTY(QString textMessageSenderName READ textMessageSenderName WRITE
+                       setTextMessageSenderName NOTIFY textMessageSenderNameChanged)
+    Q_PROPERTY(QString textMessageSenderNumber READ textMessageSenderNumber WRITE
+                       setTextMessageSenderNumber NOTIFY textMessageSenderNumberChanged)
     Q_PROPERTY(int listenMessageLineNo READ listenMessageLineNo WRITE setListenMessageLineNo NOTIFY
                        listenMessageLineNoChanged)
     Q_PROPERTY(int replyMessageLineNo READ replyMessageLineNo WRITE setReplyMessageLineNo NOTIFY
@@ -135,6 +140,15 @@ public:
     // The text messages of the inbox, newest first: roles "name", "number", "time" (as above),
     // "text" (QString) and "read" (bool).
     Q_INVOKABLE Mavrosk::MultiDPListModel *textMessageList() const;
+    // The calls the phone has now, in the order they began: roles "name" (QString, empty for a
+    // number not in the contacts), "number" (QString, empty for a withheld number), "callState"
+    // (QString: "incoming", "waiting", "dialing", "active" or "held") and "duration" (int,
+    // seconds since the call was connected; 0 before). Kept by this stand-in for the views.
+    Q_INVOKABLE Mavrosk::MultiDPListModel *callList() const;
+    // The phone's status alerts the driver has not cleared: roles "alertId" (int, 1001 to 1010)
+    // and "supportPhoneNumber" (QString, empty unless the alert offers a number to call). Kept by
+    // this stand-in for the views.
+    Q_INVOKABLE Mavrosk::MultiDPListModel *statusAlertList() const;
 
     int status() const { return m_status; }
     bool incomingCall() const { return m_incomingCall; }
@@ -142,6 +156,7 @@ public:
     bool dialingInProgress() const { return m_dialingInProgress; }
     bool multipleCallsConnected() const { return m_multipleCallsConnected; }
     bool privateMode() const { return m_privateMode; }
+    bool muted() const { return m_muted; }
     int emergencyCallStatus() const { return m_emergencyCallStatus; }
     bool doNotDisturb() const { return m_doNotDisturb; }
     bool roaming() const { return m_roaming; }
@@ -191,6 +206,8 @@ public:
     int smsTotalCount() const { return m_smsTotalCount; }
     int totalUnreadSmsCount() const { return m_totalUnreadSmsCount; }
     QString textMessageBody() const { return m_textMessageBody; }
+    QString textMessageSenderName() const { return m_textMessageSenderName; }
+    QString textMessageSenderNumber() const { return m_textMessageSenderNumber; }
     int listenMessageLineNo() const { return m_listenMessageLineNo; }
     int replyMessageLineNo() const { return m_replyMessageLineNo; }
     QVariantList smsReplyMessages() const { return m_smsReplyMessages; }
@@ -207,6 +224,7 @@ public:
     void setDialingInProgress(bool value);
     void setMultipleCallsConnected(bool value);
     void setPrivateMode(bool value);
+    void setMuted(bool value);
     void setEmergencyCallStatus(int value);
     void setDoNotDisturb(bool value);
     void setRoaming(bool value);
@@ -247,6 +265,8 @@ public:
     void setSmsTotalCount(int value);
     void setTotalUnreadSmsCount(int value);
     void setTextMessageBody(const QString &value);
+    void setTextMessageSenderName(const QString &value);
+    void setTextMessageSenderNumber(const QString &value);
     void setListenMessageLineNo(int value);
     void setReplyMessageLineNo(int value);
     void setSmsReplyMessages(const QVariantList &value);
@@ -316,6 +336,7 @@ signals:
     void dialingInProgressChanged(bool value);
     void multipleCallsConnectedChanged(bool value);
     void privateModeChanged(bool value);
+    void mutedChanged(bool value);
     void emergencyCallStatusChanged(int value);
     void doNotDisturbChanged(bool value);
     void roamingChanged(bool value);
@@ -356,6 +377,8 @@ signals:
     void smsTotalCountChanged(int value);
     void totalUnreadSmsCountChanged(int value);
     void textMessageBodyChanged(const QString &value);
+    void textMessageSenderNameChanged(const QString &value);
+    void textMessageSenderNumberChanged(const QString &value);
     void listenMessageLineNoChanged(int value);
     void replyMessageLineNoChanged(int value);
     void smsReplyMessagesChanged(const QVariantList &value);
@@ -405,12 +428,15 @@ private:
     InfiniteListModel *m_phoneBook;
     MultiDPListModel *m_recentCallList;
     MultiDPListModel *m_textMessageList;
+    MultiDPListModel *m_callList;
+    MultiDPListModel *m_statusAlertList;
     int m_status = 0;
     bool m_incomingCall = false;
     bool m_callConnected = false;
     bool m_dialingInProgress = false;
     bool m_multipleCallsConnected = false;
     bool m_privateMode = false;
+    bool m_muted = false;
     int m_emergencyCallStatus = 0;
     bool m_doNotDisturb = false;
     bool m_roaming = false;
@@ -451,6 +477,8 @@ private:
     int m_smsTotalCount = 0;
     int m_totalUnreadSmsCount = 0;
     QString m_textMessageBody;
+    QString m_textMessageSenderName;
+    QString m_textMessageSenderNumber;
     int m_listenMessageLineNo = 0;
     int m_replyMessageLineNo = 0;
     QVariantList m_smsReplyMessages;

@@ -2,6 +2,7 @@
 
 #include <QString>
 #include <QVariantList>
+#include <QtGlobal>
 
 namespace Simulator {
 
@@ -12,19 +13,19 @@ struct CarKey
 {
     int code;
     const char *meaning; // as the README names it
-    const char *label; // the window's button (UTF-8)
+    const char *label; // the window's button (UTF-8), translated in the context "CarKeys"
 };
 
 inline constexpr CarKey CarKeys[] = {
-        {12, "phone", "Phone"},
-        {49, "send", "Send"},
-        {50, "end", "End"},
-        {77, "accept, or seek left", "Accept/\u25C0"},
-        {78, "reject, or seek right", "Reject/\u25B6"},
-        {79, "send (second key)", "Send 2"},
-        {80, "end (second key)", "End 2"},
-        {90, "steering-wheel seek down", "Wheel \u25BC"},
-        {91, "steering-wheel seek up", "Wheel \u25B2"},
+        {12, "phone", QT_TRANSLATE_NOOP("CarKeys", "Phone")},
+        {49, "send", QT_TRANSLATE_NOOP("CarKeys", "Send")},
+        {50, "end", QT_TRANSLATE_NOOP("CarKeys", "End")},
+        {77, "accept, or seek left", QT_TRANSLATE_NOOP("CarKeys", "Accept/\u25C0")},
+        {78, "reject, or seek right", QT_TRANSLATE_NOOP("CarKeys", "Reject/\u25B6")},
+        {79, "send (second key)", QT_TRANSLATE_NOOP("CarKeys", "Send 2")},
+        {80, "end (second key)", QT_TRANSLATE_NOOP("CarKeys", "End 2")},
+        {90, "steering-wheel seek down", QT_TRANSLATE_NOOP("CarKeys", "Wheel \u25BC")},
+        {91, "steering-wheel seek up", QT_TRANSLATE_NOOP("CarKeys", "Wheel \u25B2")},
 };
 
 // Kinds of a key event, from 1.

@@ -6,8 +6,7 @@
 #include <brisken/datastore.h>
 #include <brisken/statusbarcontroller.h>
 #include <brisken/viewcontroller.h>
-#include <mavrosk/infinitelistmodel.h>
-#include <mavrosk/phonesource.h>
+#include <mavrosk/bridge.h>
 #include <quorvel/popupstate.h>
 #include <quorvel/statemachine.h>
 
@@ -74,16 +73,7 @@ bool valuesMatch(const QJsonValue &actual, const QJsonValue &expected)
 // The bridge's list models by name; a check of one compares its number of rows.
 QAbstractItemModel *listModel(const QString &name)
 {
-    Mavrosk::PhoneSource *phone = Mavrosk::PhoneSource::instance();
-    if (name == QLatin1String("phone.phoneBook"))
-        return phone->phoneBook();
-    if (name == QLatin1String("phone.AlphabetIndexModel"))
-        return phone->AlphabetIndexModel();
-    if (name == QLatin1String("phone.recentCallList"))
-        return phone->recentCallList();
-    if (name == QLatin1String("phone.textMessageList"))
-        return phone->textMessageList();
-    return nullptr;
+    return Mavrosk::listModel(name);
 }
 
 bool readValue(const QString &name, QObject *controller, QVariant *value, QString *error)

@@ -244,6 +244,19 @@ int main(int argc, char *argv[])
                            "of the display to the directory after each step that changes it, "
                            "named by the step's line."),
             QStringLiteral("directory"));
+    const QCommandLineOption qmlOption(
+            QStringLiteral("qml"),
+            QStringLiteral("With --window or --screenshots: read the window's QML from this "
+                           "folder (a copy of tools/simulator/window/qml, or that folder itself) "
+                           "instead of the built-in files; the window draws itself again whenever "
+                           "a file in it changes."),
+            QStringLiteral("folder"));
+    const QCommandLineOption langOption(
+            QStringLiteral("lang"),
+            QStringLiteral("With --window or --screenshots: the language of the window's texts, "
+                           "en or de (default: the system's language if the window has it, else "
+                           "en)."),
+            QStringLiteral("language"));
     const QCommandLineOption randomOption(
             QStringLiteral("random"),
             QStringLiteral("Play random steps from this seed instead of a scenario, checking the "
@@ -263,8 +276,8 @@ int main(int argc, char *argv[])
                            "runs (scenario, typed and --screenshots steps); exits 1 on the first "
                            "violation."));
     parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
-                       windowOption, screenshotsOption, randomOption, stepsOption,
-                       writeScenarioOption, invariantsOption});
+                       windowOption, screenshotsOption, qmlOption, langOption, randomOption,
+                       stepsOption, writeScenarioOption, invariantsOption});
     // A command line the simulator cannot run exits 2, like any other reason it cannot run.
     if (!parser.parse(QCoreApplication::arguments())) {
         printError(parser.errorText() + QStringLiteral(" (see --help)"));
@@ -290,6 +303,10 @@ int main(int argc, char *argv[])
             ? QStringLiteral("--random checks the invariants anyway; no --check-invariants")
             : parser.isSet(windowOption) && parser.isSet(screenshotsOption)
             ? QStringLiteral("either --window or --screenshots")
+            : parser.isSet(qmlOption) && display == Display::None
+            ? QStringLiteral("--qml goes with --window or --screenshots")
+            : parser.isSet(langOption) && display == Display::None
+            ? QStringLiteral("--lang goes with --window or --screenshots")
             : QString();
     if (!refused.isEmpty()) {
         printError(refused);
@@ -320,6 +337,21 @@ int main(int argc, char *argv[])
         printError(QStringLiteral("--window and --screenshots read no steps from stdin"));
         return CannotRun;
     }
+    const QString qmlFolder = parser.value(qmlOption);
+    if (parser.isSet(qmlOption)
+        && !QFileInfo::exists(QDir(qmlFolder).filePath(QStringLiteral("Main.qml")))) {
+        printError(QStringLiteral("--qml: %1 has no Main.qml").arg(qmlFolder));
+        return CannotRun;
+    }
+#ifdef HMIPHONE_WITH_WINDOW
+    if (display != Display::None) {
+        QString error;
+        if (!Simulator::HeadUnitWindow::installTranslation(parser.value(langOption), &error)) {
+            printError(QStringLiteral("--lang: %1").arg(error));
+            return CannotRun;
+        }
+    }
+#endif
     const QString phoneMode = parser.value(phoneOption);
     if (phoneMode != QLatin1String("scripted") && phoneMode != QLatin1String("simulated")) {
         printError(QStringLiteral("--phone is scripted or simulated"));
@@ -438,7 +470,8 @@ int main(int argc, char *argv[])
         Simulator::HeadUnitWindow window(&engine, &output, clock, playChecked,
                                          display == Display::Window
                                                  ? Simulator::HeadUnitWindow::OnScreen
-                                                 : Simulator::HeadUnitWindow::OffScreen);
+                                                 : Simulator::HeadUnitWindow::OffScreen,
+                                         qmlFolder);
         window.setScenario(steps);
         if (display == Display::Window) {
             window.show();

@@ -3,7 +3,9 @@
 #include "expectationjudge.h"
 
 #include <brisken/datastore.h>
+#include <mavrosk/bridge.h>
 #include <mavrosk/datasource.h>
+#include <mavrosk/infinitelistmodel.h>
 
 #include <QJsonArray>
 #include <QJsonObject>
@@ -155,13 +157,14 @@ QString checkCall(const ScenarioStep &step, const QObject *controller)
 QString checkModel(const ScenarioStep &step)
 {
     const QString name = step.name();
-    if (name == QLatin1String("phone.phoneBook"))
-        return QString();
-    if (name == QLatin1String("phone.AlphabetIndexModel"))
-        return step.object.contains(QLatin1String("length"))
-                ? QStringLiteral("the alphabet bar has rows only, no \"length\"")
-                : QString();
-    return QStringLiteral("unknown list model %1").arg(name);
+    Mavrosk::MultiDPListModel *model = Mavrosk::listModel(name);
+    if (!model)
+        return QStringLiteral("unknown list model %1").arg(name);
+    // Only the contact list has a length beyond its rows.
+    if (step.object.contains(QLatin1String("length"))
+        && !qobject_cast<Mavrosk::InfiniteListModel *>(model))
+        return QStringLiteral("%1 has rows only, no \"length\"").arg(name);
+    return QString();
 }
 
 } // namespace

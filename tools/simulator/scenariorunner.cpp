@@ -271,18 +271,13 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
         Quorvel::StateMachine::instance()->back(step.value("back").toInt());
         return QString();
     case ScenarioStep::Model: {
-        auto *phone = Mavrosk::PhoneSource::instance();
-        const QVariantList rows = step.value("rows").toArray().toVariantList();
-        if (step.name() == QLatin1String("phone.AlphabetIndexModel")) {
-            phone->AlphabetIndexModel()->setRows(rows);
-            return QString();
-        }
-        // The contact list is a kind of row list that also has a length of its own.
-        Mavrosk::InfiniteListModel *contacts = phone->phoneBook();
+        Mavrosk::MultiDPListModel *model = Mavrosk::listModel(step.name());
         if (step.object.contains(QLatin1String("rows")))
-            contacts->setRows(rows);
+            model->setRows(step.value("rows").toArray().toVariantList());
+        // The contact list is a kind of row list that also has a length of its own.
         if (step.object.contains(QLatin1String("length")))
-            contacts->setListLength(step.value("length").toInt());
+            qobject_cast<Mavrosk::InfiniteListModel *>(model)->setListLength(
+                    step.value("length").toInt());
         return QString();
     }
     case ScenarioStep::Advance:

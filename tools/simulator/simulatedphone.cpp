@@ -32,6 +32,12 @@ constexpr int Dialling = 3;
 constexpr int OneCall = 7;
 constexpr int TwoCalls = 9;
 constexpr int TwoCallsJoined = 10;
+// States of a call in the bridge's call list.
+const QString Incoming = QStringLiteral("incoming");
+const QString Waiting = QStringLiteral("waiting");
+const QString Dialing = QStringLiteral("dialing");
+const QString Active = QStringLiteral("active");
+const QString Held = QStringLiteral("held");
 // Send status while a text message is on its way (2 sent, 0 and 1 failed, 3 network failure).
 constexpr int SendingMessage = 4;
 // Phone book status.
@@ -81,6 +87,12 @@ constexpr int ReplyCount = 3;
 const char *const Replies[ReplyCount]
         = {"On my way.", "Can't talk now, I'm driving.", "I'll call you later."};
 
+// The phone's status alerts when it connects: one that offers the support line (a number in the
+// range kept for fiction) and one without.
+constexpr int SupportAlert = 1003;
+constexpr int PlainAlert = 1009;
+const char *const SupportNumber = "+44 20 7946 0321";
+
 // A number in the range kept for fiction, one per index.
 QString fictionalNumber(int index)
 {
@@ -98,10 +110,14 @@ SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent)
     : QObject(parent)
     , m_clock(clock)
     , m_dialTimer(new QTimer(this))
+    , m_callClock(new QTimer(this))
 {
     m_dialTimer->setSingleShot(true);
     m_dialTimer->setInterval(DialConnectDelay);
     connect(m_dialTimer, &QTimer::timeout, this, &SimulatedPhone::callConnected);
+    m_callClock->setInterval(1000);
+    connect(m_callClock, &QTimer::timeout, this, &SimulatedPhone::publishCalls);
+    connect(phone(), &Mavrosk::PhoneSource::statusChanged, this, &SimulatedPhone::onStatusChanged);
     connect(Platform::Journal::instance(), &Platform::Journal::appended, this,
             &SimulatedPhone::onJournalEntry);
     // Calls and messages that come from the phone's side are remembered once they settled.
@@ -161,6 +177,11 @@ void SimulatedPhone::connectPhone()
         replies.append(QVariantMap{{QStringLiteral("text"), QLatin1String(reply)}});
     setPhone("smsReplyMessages", replies);
     setPhone("recentCallListStatus", RecentCallsAvailable);
+    phone()->statusAlertList()->setRows(
+            {QVariantMap{{QStringLiteral("alertId"), SupportAlert},
+                         {QStringLiteral("supportPhoneNumber"), QLatin1String(SupportNumber)}},
+             QVariantMap{{QStringLiteral("alertId"), PlainAlert},
+                         {QStringLiteral("supportPhoneNumber"), QString()}}});
     contactsDownloaded();
     messagesDownloaded();
 }
@@ -200,6 +221,17 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     if (command == QLatin1String("acceptIncomingCall")) {
         const bool second = p->callConnected();
         m_answered = true;
+        for (Call &held : m_activeCalls) {
+            if (held.state == Active)
+                held.state = Held;
+        }
+        for (Call &ringing : m_activeCalls) {
+            if (ringing.state == Incoming || ringing.state == Waiting) {
+                ringing.state = Active;
+                ringing.connectedAt = m_clock ? m_clock->now() : 0;
+            }
+        }
+        publishCalls();
         logCall(caller(m_nextCaller), Received);
         setPhone("incomingCall", false);
         setPhone("callConnected", true);
@@ -223,6 +255,15 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     } else if (command == QLatin1String("joinCalls")) {
         if (p->status() == TwoCalls)
             setPhone("status", TwoCallsJoined);
+        for (Call &held : m_activeCalls) {
+            if (held.state == Held)
+                held.state = Active;
+        }
+        publishCalls();
+    } else if (command == QLatin1String("swapCall")) {
+        swapCalls();
+    } else if (command == QLatin1String("toggleMuted")) {
+        setPhone("muted", !p->muted());
     } else if (command == QLatin1String("togglePrivacyMode")) {
         setPhone("privateMode", !p->privateMode());
     } else if (command == QLatin1String("enableDoNotDisturb")
@@ -256,6 +297,11 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
         showMessage(args.value(0).toInt(), false);
     } else if (command == QLatin1String("requestNewTextMessageDetails")) {
         showMessage(0, true);
+    } else if (command == QLatin1String("clearAlertPermanently")
+               || command == QLatin1String("clearAlertForThisCycle")) {
+        clearAlert(args.value(0).toInt());
+    } else if (command == QLatin1String("callForFixAlert")) {
+        dial(args.value(1).toString());
     } else if (command == QLatin1String("initiateSendTextMessage")) {
         // A status of its own while the message goes, so that every send reports its outcome
         // as a change.
@@ -273,12 +319,14 @@ void SimulatedPhone::dial(const QString &number)
         emit phone()->phoneDialingFailed(1);
         return;
     }
-    Entry called{QString(), number, {}, 0, {}, true};
-    for (const Entry &contact : qAsConst(m_contacts)) {
-        if (contact.number == number)
-            called = contact;
-    }
+    const Entry called = whoHas(number);
     logCall(called, Dialled);
+    for (Call &held : m_activeCalls) {
+        if (held.state == Active)
+            held.state = Held;
+    }
+    m_activeCalls.append({called, Dialing});
+    publishCalls();
     setPhone("dialingInProgress", true);
     setPhone("status", Dialling);
     m_dialTimer->start();
@@ -286,6 +334,13 @@ void SimulatedPhone::dial(const QString &number)
 
 void SimulatedPhone::callConnected()
 {
+    for (Call &dialled : m_activeCalls) {
+        if (dialled.state == Dialing) {
+            dialled.state = Active;
+            dialled.connectedAt = m_clock ? m_clock->now() : 0;
+        }
+    }
+    publishCalls();
     setPhone("dialingInProgress", false);
     setPhone("callConnected", true);
     setPhone("status", OneCall);
@@ -294,6 +349,9 @@ void SimulatedPhone::callConnected()
 void SimulatedPhone::callEnded()
 {
     m_dialTimer->stop();
+    m_activeCalls.clear();
+    publishCalls();
+    setPhone("muted", false);
     setPhone("dialingInProgress", false);
     setPhone("incomingCall", false);
     setPhone("multipleCallsConnected", false);
@@ -308,8 +366,17 @@ void SimulatedPhone::onIncomingCallChanged(bool ringing)
     m_ringing = ringing;
     if (ringing) {
         m_answered = false;
+        m_activeCalls.append({caller(m_nextCaller), phone()->callConnected() ? Waiting : Incoming});
+        publishCalls();
         return;
     }
+    // Answered or not, the call rings no longer.
+    m_activeCalls.erase(std::remove_if(m_activeCalls.begin(), m_activeCalls.end(),
+                                       [](const Call &call) {
+                                           return call.state == Incoming || call.state == Waiting;
+                                       }),
+                        m_activeCalls.end());
+    publishCalls();
     // The ringing stopped without an answer: a missed call, from the one who rang.
     if (!m_answered)
         logCall(caller(m_nextCaller), Missed);
@@ -319,6 +386,76 @@ void SimulatedPhone::onIncomingCallChanged(bool ringing)
 SimulatedPhone::Entry SimulatedPhone::caller(int index) const
 {
     return m_contacts.at((index * 11 + 2) % m_contacts.size());
+}
+
+SimulatedPhone::Entry SimulatedPhone::whoHas(const QString &number) const
+{
+    for (const Entry &contact : m_contacts) {
+        if (contact.number == number)
+            return contact;
+    }
+    return Entry{QString(), number, {}, 0, {}, true};
+}
+
+void SimulatedPhone::onStatusChanged(int status)
+{
+    // No call in progress any more (the phone's side may say so directly): only a call that
+    // rings is left.
+    if (status > 2 || m_activeCalls.isEmpty())
+        return;
+    m_activeCalls.erase(std::remove_if(m_activeCalls.begin(), m_activeCalls.end(),
+                                       [](const Call &call) {
+                                           return call.state != Incoming && call.state != Waiting;
+                                       }),
+                        m_activeCalls.end());
+    publishCalls();
+    setPhone("muted", false);
+}
+
+void SimulatedPhone::publishCalls()
+{
+    const qint64 now = m_clock ? m_clock->now() : 0;
+    QVariantList rows;
+    bool connected = false;
+    for (const Call &call : qAsConst(m_activeCalls)) {
+        connected = connected || call.connectedAt >= 0;
+        rows.append(QVariantMap{{QStringLiteral("name"), call.who.name},
+                                {QStringLiteral("number"), call.who.number},
+                                {QStringLiteral("callState"), call.state},
+                                {QStringLiteral("duration"),
+                                 call.connectedAt < 0 ? 0 : int((now - call.connectedAt) / 1000)}});
+    }
+    phone()->callList()->setRows(rows);
+    if (!connected)
+        m_callClock->stop();
+    else if (!m_callClock->isActive())
+        m_callClock->start();
+}
+
+void SimulatedPhone::swapCalls()
+{
+    for (Call &call : m_activeCalls) {
+        if (call.state == Active)
+            call.state = Held;
+        else if (call.state == Held)
+            call.state = Active;
+    }
+    publishCalls();
+}
+
+void SimulatedPhone::clearAlert(int alertId)
+{
+    QVariantList rows;
+    Mavrosk::MultiDPListModel *alerts = phone()->statusAlertList();
+    for (int row = 0; row < alerts->count(); ++row) {
+        if (alerts->get(row, QStringLiteral("alertId")).toInt() != alertId)
+            rows.append(QVariantMap{
+                    {QStringLiteral("alertId"), alerts->get(row, QStringLiteral("alertId"))},
+                    {QStringLiteral("supportPhoneNumber"),
+                     alerts->get(row, QStringLiteral("supportPhoneNumber"))}});
+    }
+    if (rows.size() != alerts->count())
+        alerts->setRows(rows);
 }
 
 void SimulatedPhone::logCall(const Entry &caller, int type)
@@ -345,6 +482,8 @@ void SimulatedPhone::onNewTextMessage()
     message.time = now();
     message.read = false;
     m_messages.prepend(message);
+    setPhone("textMessageSenderName", message.name);
+    setPhone("textMessageSenderNumber", message.number);
     setPhone("messagesInboxEmptyStatus", false);
     setPhone("smsTotalCount", m_messages.size());
     setPhone("totalUnreadSmsCount", phone()->totalUnreadSmsCount() + 1);
@@ -354,7 +493,10 @@ void SimulatedPhone::showMessage(int index, bool fromAlert)
 {
     // A selection is a row of the inbox the head unit holds; an alert is the newest message.
     if (fromAlert) {
-        setPhone("textMessageBody", m_messages.isEmpty() ? QString() : m_messages.first().text);
+        const Entry newest = m_messages.value(0);
+        setPhone("textMessageSenderName", newest.name);
+        setPhone("textMessageSenderNumber", newest.number);
+        setPhone("textMessageBody", newest.text);
         emit phone()->newTextMessageDetailsReady();
         return;
     }
@@ -371,6 +513,8 @@ void SimulatedPhone::showMessage(int index, bool fromAlert)
         phone()->textMessageList()->setRows(messageRows(m_downloadedMessages));
         setPhone("totalUnreadSmsCount", qMax(0, phone()->totalUnreadSmsCount() - 1));
     }
+    setPhone("textMessageSenderName", shown.name);
+    setPhone("textMessageSenderNumber", shown.number);
     setPhone("textMessageBody", shown.text);
     emit phone()->textMessageDetailsReady();
 }

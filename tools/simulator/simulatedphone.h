@@ -26,7 +26,9 @@ class VirtualEventDispatcher;
 //   - recent calls: 1 (a list to download); asked for it, 3 (downloading), then the list of the
 //     type asked for and 2 (downloaded); a new call makes it 1 again;
 //   - messages: 2 (running), then the inbox and its counts, then 3 (finished).
-// Calls and text messages that come and go are added to its lists. Its delays run on the virtual
+// Calls and text messages that come and go are added to its lists. The calls it has now (who,
+// their state, how long they have been connected, ticking once a second) and its status alerts
+// are in the bridge's call and alert lists. Its delays run on the virtual
 // clock, and its times are those of a fixed morning moved on by the clock.
 class SimulatedPhone : public QObject
 {
@@ -69,6 +71,11 @@ private:
     void callConnected();
     void callEnded();
     void onIncomingCallChanged(bool ringing);
+    void onStatusChanged(int status);
+    // The calls of now into the bridge's call list, and the second tick while one is connected.
+    void publishCalls();
+    void swapCalls();
+    void clearAlert(int alertId);
     void onNewTextMessage();
     void logCall(const Entry &caller, int type);
     void downloadContacts();
@@ -82,9 +89,19 @@ private:
     void later(int delay, void (SimulatedPhone::*reaction)());
     QDateTime now() const;
     Entry caller(int index) const;
+    Entry whoHas(const QString &number) const;
+
+    struct Call
+    {
+        Entry who;
+        QString state; // as the call list has it: "incoming", "dialing", "active", ...
+        qint64 connectedAt = -1; // virtual ms
+    };
 
     VirtualEventDispatcher *m_clock;
     QTimer *m_dialTimer;
+    QTimer *m_callClock;
+    QList<Call> m_activeCalls; // in the order they began
     QList<Entry> m_contacts; // by name
     QList<Entry> m_calls; // newest first
     QList<Entry> m_messages; // newest first

@@ -3,10 +3,13 @@
 #include "carkeys.h"
 #include "headunitscreen.h"
 #include "outputwriter.h"
+#include "qmlfolder.h"
 
 #include <QDebug>
 #include <QDir>
 #include <QGuiApplication>
+#include <QLocale>
+#include <QPointer>
 #include <QQmlComponent>
 #include <QQmlContext>
 #include <QQmlEngine>
@@ -16,11 +19,16 @@
 #include <QQuickWindow>
 #include <QSGRendererInterface>
 #include <QStringListModel>
+#include <QTranslator>
 
 // Resources of a static library are registered by hand, outside any namespace.
 static void initWindowResources()
 {
-    Q_INIT_RESOURCE(window);
+    static const bool registered = [] {
+        Q_INIT_RESOURCE(window);
+        return true;
+    }();
+    Q_UNUSED(registered)
 }
 
 namespace Simulator {
@@ -32,7 +40,57 @@ const QSize DisplaySize(1280, 720);
 
 const char *const ExportedNames[] = {"_hmiphone", "_hmiphoneController"};
 
+const QString TranslationFolder = QStringLiteral(":/hmiphone-sim/i18n");
+const QString TranslationPrefix = QStringLiteral("hmiphone-sim_");
+
+// The translation installed for the window's texts, if any.
+QPointer<QTranslator> s_translator;
+
 } // namespace
+
+QStringList HeadUnitWindow::languages()
+{
+    initWindowResources();
+    QStringList found;
+    const QStringList files
+            = QDir(TranslationFolder).entryList({TranslationPrefix + QLatin1Char('*')});
+    for (const QString &file : files)
+        found.append(file.mid(TranslationPrefix.size()).section(QLatin1Char('.'), 0, 0));
+    return found;
+}
+
+bool HeadUnitWindow::installTranslation(const QString &language, QString *error)
+{
+    QStringList wanted{language};
+    if (language.isEmpty()) {
+        // The system's languages in the order the user prefers them, "de-DE" as "de".
+        wanted.clear();
+        const QStringList system = QLocale::system().uiLanguages();
+        for (const QString &name : system)
+            wanted.append(name.section(QLatin1Char('-'), 0, 0));
+    }
+    delete s_translator;
+    const QStringList available = languages();
+    for (const QString &name : qAsConst(wanted)) {
+        if (name == QLatin1String("en") || name == QLatin1String("C"))
+            return true;
+        if (!available.contains(name))
+            continue;
+        auto *translator = new QTranslator(QCoreApplication::instance());
+        if (!translator->load(TranslationPrefix + name, TranslationFolder)) {
+            delete translator;
+            break;
+        }
+        QCoreApplication::installTranslator(translator);
+        s_translator = translator;
+        return true;
+    }
+    if (language.isEmpty())
+        return true;
+    *error = QStringLiteral("no translation for %1 (en, %2)")
+                     .arg(language, available.join(QStringLiteral(", ")));
+    return false;
+}
 
 QCoreApplication *HeadUnitWindow::createApplication(int &argc, char **argv, Mode mode)
 {
@@ -47,11 +105,14 @@ QCoreApplication *HeadUnitWindow::createApplication(int &argc, char **argv, Mode
 
 HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
                                VirtualEventDispatcher *clock, ScenarioPlayer::PlayStep playStep,
-                               Mode mode, QObject *parent)
+                               Mode mode, const QString &qmlFolder, QObject *parent)
     : QObject(parent)
     , m_screen(new HeadUnitScreen(clock, mode == OnScreen, this))
     , m_player(new ScenarioPlayer(std::move(playStep), mode == OnScreen, this))
     , m_trace(new QStringListModel(this))
+    , m_engine(engine)
+    , m_mode(mode)
+    , m_main(QStringLiteral("qrc:/hmiphone-sim/Main.qml"))
 {
     initWindowResources();
     if (output)
@@ -72,30 +133,25 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
     context->setContextProperty(QStringLiteral("_trace"), m_trace);
     context->setContextProperty(QStringLiteral("_carKeys"), carKeysForQml());
 
-    const QUrl main(QStringLiteral("qrc:/hmiphone-sim/Main.qml"));
+    if (!qmlFolder.isEmpty()) {
+        m_main = QUrl::fromLocalFile(QDir(qmlFolder).absoluteFilePath(QStringLiteral("Main.qml")));
+        m_qmlFolder = new QmlFolder(qmlFolder, this);
+        connect(m_qmlFolder, &QmlFolder::changed, this, &HeadUnitWindow::reload);
+    }
     if (mode == OnScreen) {
         auto *view = new QQuickView(engine, nullptr);
         view->setTitle(QStringLiteral("hmiphone-sim"));
         view->setResizeMode(QQuickView::SizeRootObjectToView);
-        view->setSource(main);
         view->resize(DisplaySize);
         m_window = view;
-        m_root = view->rootObject();
     } else {
         m_renderControl = new QQuickRenderControl(this);
         m_window = new QQuickWindow(m_renderControl);
         m_window->resize(DisplaySize);
-        QQmlComponent component(engine, main);
-        m_root = qobject_cast<QQuickItem *>(
-                component.createWithInitialProperties({{QStringLiteral("displayOnly"), true}}));
-        if (m_root) {
-            m_root->setParentItem(m_window->contentItem());
-            m_root->setSize(DisplaySize);
-        } else {
-            qWarning().noquote() << component.errorString();
-        }
-        m_renderControl->initialize(nullptr);
     }
+    load();
+    if (m_renderControl)
+        m_renderControl->initialize(nullptr);
     m_screen->refresh();
 }
 
@@ -105,6 +161,37 @@ HeadUnitWindow::~HeadUnitWindow()
     // The render control releases the scene graph it drew, before its window goes.
     delete m_renderControl;
     delete m_window;
+}
+
+void HeadUnitWindow::load()
+{
+    if (auto *view = qobject_cast<QQuickView *>(m_window)) {
+        view->setSource(m_main);
+        m_root = view->rootObject();
+        return;
+    }
+    QQmlComponent component(m_engine, m_main);
+    m_root = qobject_cast<QQuickItem *>(
+            component.createWithInitialProperties({{QStringLiteral("displayOnly"), true}}));
+    if (m_root) {
+        m_root->setParentItem(m_window->contentItem());
+        m_root->setSize(DisplaySize);
+    } else {
+        qWarning().noquote() << component.errorString();
+    }
+}
+
+void HeadUnitWindow::reload()
+{
+    // The engine forgets the files it compiled only once nothing made from them is left.
+    if (auto *view = qobject_cast<QQuickView *>(m_window))
+        view->setSource(QUrl());
+    else
+        delete m_root;
+    m_root = nullptr;
+    m_engine->clearComponentCache();
+    load();
+    emit reloaded();
 }
 
 void HeadUnitWindow::setScenario(const QList<ScenarioStep> &steps)

@@ -22,6 +22,7 @@ Rectangle {
 
     Text {
         id: label
+        objectName: "buttonLabel"
         anchors.centerIn: parent
         width: parent.width - 16
         horizontalAlignment: Text.AlignHCenter

@@ -26,7 +26,7 @@ Rectangle {
         y: statusBar.height
         width: parent.width
         height: parent.height - statusBar.height
-        source: "pages/" + Views.pageFor(display.viewId) + ".qml"
+        source: "screens/" + Views.screenFor(display.viewId) + ".qml"
     }
     Binding {
         target: screen.item
@@ -41,8 +41,7 @@ Rectangle {
         anchors.margins: 8
         text: display.viewId
         color: Theme.dim
-        font.family: Theme.font
-        font.pixelSize: 16
+        font { family: Theme.font; pixelSize: 16 }
     }
 
     PopupLayer {
@@ -51,6 +50,5 @@ Rectangle {
         width: parent.width
         height: parent.height - statusBar.height
         popups: display.popups
-        controller: display.controller
     }
 }

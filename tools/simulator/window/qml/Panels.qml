@@ -30,7 +30,7 @@ Rectangle {
             width: 140
             height: 30
             fontSize: 14
-            text: "long"
+            text: qsTr("long")
             onClicked: _scenario.pressKey(parent.code, true)
         }
     }
@@ -47,56 +47,58 @@ Rectangle {
         y: 16
         spacing: 10
 
-        Heading { text: "Car keys" }
+        Heading { text: qsTr("Car keys") }
         Grid {
             columns: 4
             spacing: 10
             // The simulator's table of the car's keys.
             Repeater {
                 model: _carKeys
-                Key { code: modelData.code; text: modelData.label }
+                Key { code: modelData.code; text: qsTranslate("CarKeys", modelData.label) }
             }
         }
 
-        Heading { text: "Menu bar" }
+        Heading { text: qsTr("Menu bar") }
         Row {
             spacing: 10
-            Action { width: 140; text: "Home"; step: '{"open": "home"}' }
-            Action { width: 140; text: "Phone"; step: '{"open": "phone"}' }
-            Action { width: 140; text: "Settings"; step: '{"open": "settings"}' }
-            Action { width: 140; text: "Back"; step: '{"back": 1}' }
+            Action { width: 140; text: qsTr("Home"); step: '{"open": "home"}' }
+            Action { width: 140; text: qsTr("Phone"); step: '{"open": "phone"}' }
+            Action { width: 140; text: qsTr("Settings"); step: '{"open": "settings"}' }
+            Action { width: 140; text: qsTr("Back"); step: '{"back": 1}' }
         }
 
-        Heading { text: "The phone" }
+        Heading { text: qsTr("The phone") }
         Grid {
             columns: 3
             spacing: 10
             Action {
                 objectName: "phone:ring"
-                text: "Ring"
+                text: qsTr("Ring")
                 step: '{"set": "phone.incomingCall", "value": true}'
             }
             Action {
                 objectName: "phone:hangUp"
-                text: "Caller hangs up"
+                text: qsTr("Caller hangs up")
                 step: '[{"set": "phone.incomingCall", "value": false},'
                       + '{"set": "phone.callConnected", "value": false},'
                       + '{"set": "phone.status", "value": 0}]'
             }
             Action {
-                text: "Text message"
-                step: '[{"set": "phone.textMessageBody", "value": "See you at eight?"},'
+                text: qsTr("Text message")
+                step: '[{"set": "phone.textMessageSenderName", "value": "Anna Becker"},'
+                      + '{"set": "phone.textMessageSenderNumber", "value": "+44 7700 900000"},'
+                      + '{"set": "phone.textMessageBody", "value": "See you at eight?"},'
                       + '{"emit": "phone.newTextMessageAlert", "args": []}]'
             }
-            Action { text: "Connect"; step: '{"set": "bluetooth.deviceConnected", "value": true}' }
-            Action { text: "Disconnect"; step: '{"set": "bluetooth.deviceConnected", "value": false}' }
-            Action { text: "Link loss"; step: '{"emit": "phone.nonUserDeviceDisconnectReceived", "args": []}' }
+            Action { text: qsTr("Connect"); step: '{"set": "bluetooth.deviceConnected", "value": true}' }
+            Action { text: qsTr("Disconnect"); step: '{"set": "bluetooth.deviceConnected", "value": false}' }
+            Action { text: qsTr("Link loss"); step: '{"emit": "phone.nonUserDeviceDisconnectReceived", "args": []}' }
             Action {
-                text: "Battery \u2212"
+                text: qsTr("Battery \u2212")
                 step: '{"set": "phone.deviceBatteryLevel", "value": ' + Math.max(0, panels.battery - 1) + '}'
             }
             Action {
-                text: "Battery +"
+                text: qsTr("Battery +")
                 step: '{"set": "phone.deviceBatteryLevel", "value": ' + Math.min(5, panels.battery + 1) + '}'
             }
         }

@@ -18,7 +18,7 @@ Rectangle {
                 height: 56
                 fontSize: 20
                 enabled: _scenario.next < _scenario.count
-                text: _scenario.playing ? "Pause" : "Play"
+                text: _scenario.playing ? qsTr("Pause") : qsTr("Play")
                 onClicked: _scenario.playing ? _scenario.pause() : _scenario.play()
             }
             Button {
@@ -27,15 +27,15 @@ Rectangle {
                 height: 56
                 fontSize: 20
                 enabled: _scenario.next < _scenario.count && !_scenario.waiting
-                text: "Step"
+                text: qsTr("Step")
                 onClicked: _scenario.step()
             }
         }
         Text {
             width: parent.width
-            text: _scenario.count === 0 ? "No scenario"
-                  : "Line " + Math.min(_scenario.next + 1, _scenario.count) + " of " + _scenario.count
-                    + (_scenario.waiting ? " (waiting)" : "")
+            text: _scenario.count === 0 ? qsTr("No scenario")
+                  : (_scenario.waiting ? qsTr("Line %1 of %2 (waiting)") : qsTr("Line %1 of %2"))
+                    .arg(Math.min(_scenario.next + 1, _scenario.count)).arg(_scenario.count)
             color: Theme.dim
             font.family: Theme.font
             font.pixelSize: 20

@@ -1,5 +1,4 @@
 import QtQuick 2.15
-import "Views.js" as Views
 
 // The status bar: the clock, the transient messages as they come and go, the phone's connection
 // and battery.
@@ -10,6 +9,21 @@ Rectangle {
     readonly property var bluetooth: controller ? controller.bluetoothSource : null
     readonly property bool connected: bluetooth ? bluetooth.deviceConnected : false
     readonly property int battery: phone ? phone.deviceBatteryLevel : -1
+
+    // The module's transient messages, by name.
+    function transientText(name) {
+        switch (name) {
+        case "PhoneAcceptedIncomingCall": return qsTr("Call accepted");
+        case "PhoneRejectedIncomingCall": return qsTr("Call rejected");
+        case "PhoneCallEnded": return qsTr("Call ended");
+        case "PhoneOutgoingDialing": return qsTr("Dialling");
+        case "PhoneConnectedOutgoingCall": return qsTr("Call connected");
+        case "PhonebookDownloadInitiated": return qsTr("Downloading contacts");
+        case "PhonebookDownloadComplete": return qsTr("Contacts downloaded");
+        case "PhoneVoiceServiceActivatedTransientMsg": return qsTr("Voice assistant on");
+        }
+        return name;
+    }
 
     color: "#0b0e12"
 
@@ -44,7 +58,7 @@ Rectangle {
                 Text {
                     id: message
                     anchors.centerIn: parent
-                    text: Views.title(modelData)
+                    text: bar.transientText(modelData)
                     color: Theme.text
                     font.family: Theme.font
                     font.pixelSize: 22
@@ -60,7 +74,7 @@ Rectangle {
         spacing: 24
         Text {
             objectName: "connection"
-            text: bar.connected ? "\u25CF Phone" : "\u25CB No phone"
+            text: bar.connected ? "\u25CF " + qsTr("Phone") : "\u25CB " + qsTr("No phone")
             color: bar.connected ? Theme.accept : Theme.dim
             font.family: Theme.font
             font.pixelSize: 24

@@ -5,18 +5,21 @@ import ".."
 // settings menu offers the phone's entry, as the host's menu lists it.
 Page {
     id: page
+    readonly property bool settingsMenu: viewId === "HOST.Settings"
+    title: settingsMenu ? qsTr("Settings") : viewId === "HOST.Home" ? qsTr("Home") : ""
+
     Text {
         anchors.centerIn: parent
-        horizontalAlignment: Text.AlignHCenter
-        text: "A view of another module"
+        visible: !page.settingsMenu
+        text: qsTr("Another part of the head unit")
         color: Theme.dim
-        font.family: Theme.font
-        font.pixelSize: 28
+        font { family: Theme.font; pixelSize: 28 }
     }
     Button {
         objectName: "menu:settings/Phone"
-        visible: page.viewId === "HOST.Settings"
-        text: "Phone"
+        visible: page.settingsMenu
+        width: 400
+        text: qsTr("Phone")
         onClicked: _scenario.input('{"open": "settings/Phone"}')
     }
 }

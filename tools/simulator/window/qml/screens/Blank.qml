@@ -3,12 +3,10 @@ import ".."
 
 // No view on screen: the HMI has not started, or no view state is active.
 Page {
-    title: ""
     Text {
         anchors.centerIn: parent
-        text: "No view"
+        text: qsTr("No view")
         color: Theme.dim
-        font.family: Theme.font
-        font.pixelSize: 28
+        font { family: Theme.font; pixelSize: 28 }
     }
 }
