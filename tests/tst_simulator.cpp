@@ -130,8 +130,8 @@ void SimulatorTest::scenarioFile_data()
     row("summary of a failed run", {QStringLiteral("--json")},
         "{\"open\": \"phone\"}\n{\"expect\": {\"view\": \"PhoneMenu\"}}\n", {}, 1,
         QStringLiteral("\"out\":\"step\",\"line\":1,"));
-    row("an answer to a popup that is not open", {}, "{\"answer\": \"PHONE.RoamingWarning\"}\n",
-        {}, 1, QStringLiteral(": 1 step could not be applied (line 1)"));
+    row("an answer to a popup that is not open", {}, "{\"answer\": \"PHONE.RoamingWarning\"}\n", {},
+        1, QStringLiteral(": 1 step could not be applied (line 1)"));
     row("a year at a time, twice", {},
         "{\"advance\": 31536000000}\n{\"advance\": 31536000000}\n"
         "{\"expect\": {\"view\": \"PhoneMenu\"}}\n",
