@@ -356,6 +356,7 @@ int main(int argc, char *argv[])
 {
     QCoreApplication app(argc, argv);
     QCoreApplication::setApplicationName(QStringLiteral("hmiphone-bench"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(HMIPHONE_VERSION));
     // The module's and the framework's messages are not part of the cost.
     QLoggingCategory::setFilterRules(QStringLiteral("*.debug=false\n*.info=false"));
 
@@ -365,6 +366,7 @@ int main(int argc, char *argv[])
             "same tree: instructions under valgrind --tool=callgrind --trace-children=yes, wall "
             "time otherwise."));
     parser.addHelpOption();
+    parser.addVersionOption();
     const QCommandLineOption quick(QStringLiteral("quick"),
                                    QStringLiteral("A few turns of each figure (a smoke test)."));
     const QCommandLineOption plugin(QStringLiteral("plugin"), QStringLiteral("The plug-in file."),
