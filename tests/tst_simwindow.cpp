@@ -588,6 +588,7 @@ void TestSimWindow::editedFileIsDrawnAgain()
     connectSimulatedPhone();
     play(QStringLiteral("{\"open\": \"phone\"}"));
     QScopedPointer<Simulator::HeadUnitWindow> window(newWindow(folder.path()));
+    window->watchQmlFolder();
     QQuickItem *title = findItem(window->rootItem(), QStringLiteral("title"));
     QVERIFY(title);
     QCOMPARE(title->property("text").toString(), QStringLiteral("Phone"));

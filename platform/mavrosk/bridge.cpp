@@ -27,7 +27,9 @@ void resetAll()
         source->reset();
 }
 
-QList<QPair<QString, MultiDPListModel *>> listModels()
+namespace {
+
+QList<QPair<QString, MultiDPListModel *>> findListModels()
 {
     QList<QPair<QString, MultiDPListModel *>> models;
     for (DataSource *source : createAll()) {
@@ -40,7 +42,8 @@ QList<QPair<QString, MultiDPListModel *>> listModels()
                 || !type.metaObject()->inherits(&MultiDPListModel::staticMetaObject))
                 continue;
             MultiDPListModel *model = nullptr;
-            // The getters return their model as its own type; read it through the base.
+            // A getter returns its model as its own type, a class derived from the list model
+            // alone: the pointer it writes is the list model's.
             void *result = nullptr;
             QGenericReturnArgument returned(method.typeName(), &result);
             if (method.invoke(source, Qt::DirectConnection, returned))
@@ -51,6 +54,15 @@ QList<QPair<QString, MultiDPListModel *>> listModels()
                                model});
         }
     }
+    return models;
+}
+
+} // namespace
+
+QList<QPair<QString, MultiDPListModel *>> listModels()
+{
+    // The sources and their models live as long as the process: looked up once.
+    static const QList<QPair<QString, MultiDPListModel *>> models = findListModels();
     return models;
 }
 

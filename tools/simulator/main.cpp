@@ -248,8 +248,8 @@ int main(int argc, char *argv[])
             QStringLiteral("qml"),
             QStringLiteral("With --window or --screenshots: read the window's QML from this "
                            "folder (a copy of tools/simulator/window/qml, or that folder itself) "
-                           "instead of the built-in files; the window draws itself again whenever "
-                           "a file in it changes."),
+                           "instead of the built-in files; the window (not --screenshots) draws "
+                           "itself again whenever a file in it changes."),
             QStringLiteral("folder"));
     const QCommandLineOption langOption(
             QStringLiteral("lang"),
@@ -474,6 +474,9 @@ int main(int argc, char *argv[])
                                          qmlFolder);
         window.setScenario(steps);
         if (display == Display::Window) {
+            // A designer edits the folder while the window is up; pictures are taken of it as it
+            // is.
+            window.watchQmlFolder();
             window.show();
             app.exec();
         } else {

@@ -221,10 +221,7 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     if (command == QLatin1String("acceptIncomingCall")) {
         const bool second = p->callConnected();
         m_answered = true;
-        for (Call &held : m_activeCalls) {
-            if (held.state == Active)
-                held.state = Held;
-        }
+        holdActiveCalls();
         for (Call &ringing : m_activeCalls) {
             if (ringing.state == Incoming || ringing.state == Waiting) {
                 ringing.state = Active;
@@ -321,10 +318,7 @@ void SimulatedPhone::dial(const QString &number)
     }
     const Entry called = whoHas(number);
     logCall(called, Dialled);
-    for (Call &held : m_activeCalls) {
-        if (held.state == Active)
-            held.state = Held;
-    }
+    holdActiveCalls();
     m_activeCalls.append({called, Dialing});
     publishCalls();
     setPhone("dialingInProgress", true);
@@ -430,6 +424,14 @@ void SimulatedPhone::publishCalls()
         m_callClock->stop();
     else if (!m_callClock->isActive())
         m_callClock->start();
+}
+
+void SimulatedPhone::holdActiveCalls()
+{
+    for (Call &call : m_activeCalls) {
+        if (call.state == Active)
+            call.state = Held;
+    }
 }
 
 void SimulatedPhone::swapCalls()

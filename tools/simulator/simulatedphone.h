@@ -74,6 +74,8 @@ private:
     void onStatusChanged(int status);
     // The calls of now into the bridge's call list, and the second tick while one is connected.
     void publishCalls();
+    // A call that connects puts the one in progress on hold.
+    void holdActiveCalls();
     void swapCalls();
     void clearAlert(int alertId);
     void onNewTextMessage();

@@ -134,9 +134,8 @@ HeadUnitWindow::HeadUnitWindow(QQmlEngine *engine, OutputWriter *output,
     context->setContextProperty(QStringLiteral("_carKeys"), carKeysForQml());
 
     if (!qmlFolder.isEmpty()) {
+        m_qmlFolderPath = qmlFolder;
         m_main = QUrl::fromLocalFile(QDir(qmlFolder).absoluteFilePath(QStringLiteral("Main.qml")));
-        m_qmlFolder = new QmlFolder(qmlFolder, this);
-        connect(m_qmlFolder, &QmlFolder::changed, this, &HeadUnitWindow::reload);
     }
     if (mode == OnScreen) {
         auto *view = new QQuickView(engine, nullptr);
@@ -179,6 +178,14 @@ void HeadUnitWindow::load()
     } else {
         qWarning().noquote() << component.errorString();
     }
+}
+
+void HeadUnitWindow::watchQmlFolder()
+{
+    if (m_qmlFolderPath.isEmpty() || m_qmlFolder)
+        return;
+    m_qmlFolder = new QmlFolder(m_qmlFolderPath, this);
+    connect(m_qmlFolder, &QmlFolder::changed, this, &HeadUnitWindow::reload);
 }
 
 void HeadUnitWindow::reload()

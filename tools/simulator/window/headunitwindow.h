@@ -45,8 +45,8 @@ public:
     static bool installTranslation(const QString &language, QString *error);
 
     // `engine` is the one the module exports its objects to. `qmlFolder`: a folder with the
-    // window's QML files (as in qml/ of its sources), read instead of the built-in ones and
-    // watched for changes; empty for the built-in ones.
+    // window's QML files (as in qml/ of its sources), read instead of the built-in ones; empty
+    // for the built-in ones.
     HeadUnitWindow(QQmlEngine *engine, OutputWriter *output, VirtualEventDispatcher *clock,
                    ScenarioPlayer::PlayStep playStep, Mode mode, const QString &qmlFolder = {},
                    QObject *parent = nullptr);
@@ -63,6 +63,9 @@ public:
     QImage grab();
     // Draws the window again from its QML files, read anew.
     void reload();
+    // From now on, draws the window again whenever a file of its QML folder changes (nothing
+    // without a folder). Checking costs a look at the folder twice a second of the clock.
+    void watchQmlFolder();
     QQuickItem *rootItem() const { return m_root; }
     QQuickWindow *window() const { return m_window; }
     HeadUnitScreen *screen() const { return m_screen; }
@@ -81,6 +84,7 @@ private:
     QStringListModel *m_trace;
     QQmlEngine *m_engine;
     Mode m_mode;
+    QString m_qmlFolderPath;
     QUrl m_main;
     QmlFolder *m_qmlFolder = nullptr;
     // Off screen the window is drawn by a render control into pictures alone.

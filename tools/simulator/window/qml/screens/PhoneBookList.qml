@@ -15,6 +15,8 @@ Page {
                                               book.listLength - 1)
                                    : book.listLength - 1
     readonly property int rowHeight: 64
+    // A driver-restricted window is set: only its rows are shown.
+    readonly property bool restricted: phone.driverRestrictedPhonebookModelMinRow >= 0
 
     function reportVisibleRows() {
         var perPage = Math.max(1, Math.floor(contacts.height / page.rowHeight));
@@ -24,12 +26,11 @@ Page {
     }
 
     title: qsTr("Contacts")
-    readonly property bool restricted: phone.driverRestrictedPhonebookModelMinRow >= 0
-    subtitle: restricted ? qsTr("%1 to %2 of %n", "", book.listLength).arg(firstRow + 1).arg(lastRow + 1)
+    subtitle: restricted ? qsTr("%1 to %2 of %n", "", book.listLength).arg(firstRow + 1)
+                                                                    .arg(lastRow + 1)
                          : qsTr("%n contacts", "", book.listLength)
 
     Button {
-        id: search
         x: parent.width - width - 100
         y: -84
         height: 64
