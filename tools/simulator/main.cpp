@@ -3,6 +3,7 @@
 // the phone, on a virtual clock.
 
 #include "invariants.h"
+#include "ofonophone.h"
 #include "outputwriter.h"
 #include "randomsoak.h"
 #include "scenarioreader.h"
@@ -24,6 +25,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QQmlEngine>
+#include <QSocketNotifier>
 #include <QTemporaryFile>
 #include <QTextStream>
 
@@ -33,6 +35,7 @@
 #include <iostream>
 #include <memory>
 #include <string>
+#include <unistd.h>
 
 #ifndef HMIPHONE_PLUGIN_FILE
 #define HMIPHONE_PLUGIN_FILE ""
@@ -88,6 +91,19 @@ Display displayOf(int argc, char *argv[])
             display = Display::Screenshots;
     }
     return display;
+}
+
+// Read before the application exists too: a real phone's events come in real time, so the
+// clock follows it.
+bool realPhone(int argc, char *argv[])
+{
+    for (int i = 1; i < argc; ++i) {
+        if (std::strcmp(argv[i], "--phone=ofono") == 0
+            || (std::strcmp(argv[i], "--phone") == 0 && i + 1 < argc
+                && std::strcmp(argv[i + 1], "ofono") == 0))
+            return true;
+    }
+    return false;
 }
 
 void printError(const QString &message)
@@ -170,11 +186,12 @@ int main(int argc, char *argv[])
     // The same steps give the same run: no hash order may differ between two runs.
     qSetGlobalQHashSeed(0);
     const Display display = displayOf(argc, argv);
+    const bool realTime = display == Display::Window || realPhone(argc, argv);
     auto *clock = new Simulator::VirtualEventDispatcher;
     std::unique_ptr<Simulator::VirtualEventDispatcher> realTimeClock;
-    if (display == Display::Window) {
-        // A window on screen runs the platform's event loop: the module's timers run in real
-        // time and the clock follows it.
+    if (realTime) {
+        // A window on screen runs the platform's event loop, and a real phone's events come when
+        // they come: the module's timers run in real time and the clock follows it.
         realTimeClock.reset(clock);
         clock->followRealTime();
     } else {
@@ -219,10 +236,26 @@ int main(int argc, char *argv[])
             QStringLiteral("path"), defaultPluginFile());
     const QCommandLineOption phoneOption(
             QStringLiteral("phone"),
-            QStringLiteral("Who plays the phone: \"scripted\" (the scenario alone, the default) "
-                           "or \"simulated\" (a connected phone that answers the module's "
-                           "commands and keeps contacts, recent calls and messages)."),
+            QStringLiteral("Who plays the phone: \"scripted\" (the scenario alone, the default), "
+                           "\"simulated\" (a connected phone that answers the module's "
+                           "commands and keeps contacts, recent calls and messages) or "
+                           "\"ofono\" (a real phone's calls and texts through oFono on D-Bus, "
+                           "the simulated phone's lists; time is real)."),
             QStringLiteral("mode"), QStringLiteral("scripted"));
+    const QCommandLineOption dbusAddressOption(
+            QStringLiteral("dbus-address"),
+            QStringLiteral("With --phone ofono: the D-Bus where oFono is (default: the system "
+                           "bus)."),
+            QStringLiteral("address"));
+    const QCommandLineOption modemOption(
+            QStringLiteral("modem"),
+            QStringLiteral("With --phone ofono: the oFono modem to follow (default: the first "
+                           "one powered and online)."),
+            QStringLiteral("path"));
+    const QCommandLineOption ofonoMappingOption(
+            QStringLiteral("ofono-mapping"),
+            QStringLiteral("Write the mapping between oFono and the data bridge (Markdown, as "
+                           "the README has it) and exit."));
     const QCommandLineOption interactiveOption(
             QStringLiteral("interactive"),
             QStringLiteral("Read steps from standard input, one per line, and write outputs as "
@@ -275,9 +308,10 @@ int main(int argc, char *argv[])
             QStringLiteral("Check the soak's invariants after every input step once the machine "
                            "runs (scenario, typed and --screenshots steps); exits 1 on the first "
                            "violation."));
-    parser.addOptions({jsonOption, pluginOption, phoneOption, interactiveOption, logOption,
-                       windowOption, screenshotsOption, qmlOption, langOption, randomOption,
-                       stepsOption, writeScenarioOption, invariantsOption});
+    parser.addOptions({jsonOption, pluginOption, phoneOption, dbusAddressOption, modemOption,
+                       ofonoMappingOption, interactiveOption, logOption, windowOption,
+                       screenshotsOption, qmlOption, langOption, randomOption, stepsOption,
+                       writeScenarioOption, invariantsOption});
     // A command line the simulator cannot run exits 2, like any other reason it cannot run.
     if (!parser.parse(QCoreApplication::arguments())) {
         printError(parser.errorText() + QStringLiteral(" (see --help)"));
@@ -287,9 +321,15 @@ int main(int argc, char *argv[])
     if (parser.isSet(helpOption) || parser.isSet(QStringLiteral("help-all"))
         || parser.isSet(versionOption))
         parser.process(app);
+    if (parser.isSet(ofonoMappingOption)) {
+        std::fputs(Simulator::OfonoPhone::mappingMarkdown().toUtf8().constData(), stdout);
+        return Passed;
+    }
 
     const bool interactive = parser.isSet(interactiveOption);
     const bool random = parser.isSet(randomOption);
+    const QString phoneMode = parser.value(phoneOption);
+    const bool ofono = phoneMode == QLatin1String("ofono");
     const QStringList positional = parser.positionalArguments();
     // Options that would do nothing in the mode chosen are refused, not ignored.
     const QString refused = !random && parser.isSet(stepsOption)
@@ -307,6 +347,10 @@ int main(int argc, char *argv[])
             ? QStringLiteral("--qml goes with --window or --screenshots")
             : parser.isSet(langOption) && display == Display::None
             ? QStringLiteral("--lang goes with --window or --screenshots")
+            : !ofono && (parser.isSet(dbusAddressOption) || parser.isSet(modemOption))
+            ? QStringLiteral("--dbus-address and --modem go with --phone ofono")
+            : ofono && (random || display == Display::Screenshots)
+            ? QStringLiteral("--phone ofono runs in real time: no --random, no --screenshots")
             : QString();
     if (!refused.isEmpty()) {
         printError(refused);
@@ -352,9 +396,9 @@ int main(int argc, char *argv[])
         }
     }
 #endif
-    const QString phoneMode = parser.value(phoneOption);
-    if (phoneMode != QLatin1String("scripted") && phoneMode != QLatin1String("simulated")) {
-        printError(QStringLiteral("--phone is scripted or simulated"));
+    if (phoneMode != QLatin1String("scripted") && phoneMode != QLatin1String("simulated")
+        && !ofono) {
+        printError(QStringLiteral("--phone is scripted, simulated or ofono"));
         return CannotRun;
     }
     // A soak writes only what went wrong: the log lines are not even formatted.
@@ -405,10 +449,25 @@ int main(int argc, char *argv[])
     if (phoneMode == QLatin1String("simulated")) {
         phone = new Simulator::SimulatedPhone(clock, &app);
         phone->connectPhone();
+    } else if (ofono) {
+        // The simulated phone's lists, a real phone's calls and texts.
+        phone = new Simulator::SimulatedPhone(clock, &app,
+                                              Simulator::SimulatedPhone::RealPhoneCalls);
+        phone->connectPhone();
+        auto *realPhone = new Simulator::OfonoPhone(parser.value(dbusAddressOption), phone, &app);
+        realPhone->setModem(parser.value(modemOption));
+        QObject::connect(realPhone, &Simulator::OfonoPhone::connectionChanged, &output,
+                         [&output](bool connected, const QString &what) {
+                             output.write(QStringLiteral("phone"),
+                                          {{QStringLiteral("connected"), connected},
+                                           {QStringLiteral("what"), what}});
+                         });
+        realPhone->start();
     }
 
     // The whole scenario is read and checked against the hosted module before any step runs.
     Simulator::ScenarioRunner runner(&host, &engine, ModuleName, &output, clock);
+    runner.setWaitsInRealTime(ofono && display == Display::None);
     const QList<Simulator::ScenarioError> errors = runner.prepare(steps);
     if (!runner.setUpError().isEmpty()) {
         printError(QStringLiteral("cannot host the module: %1").arg(runner.setUpError()));
@@ -498,20 +557,51 @@ int main(int argc, char *argv[])
         }
     }
     int refusedSteps = 0;
-    if (interactive && violation.isEmpty()) {
-        // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot
-        // run is refused on its own.
+    // Typed steps cannot be checked ahead: each is checked as it comes, and one that cannot run is
+    // refused on its own. False once nothing more is played.
+    auto playTyped = [&](const QByteArray &typed, int line) {
+        Simulator::ScenarioStep step = Simulator::ScenarioStep::parse(typed, line);
+        const QString error = Simulator::ScenarioReader::check(step, runner.controller());
+        if (!error.isEmpty()) {
+            printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
+            ++refusedSteps;
+            return true;
+        }
+        return play(step, QStringLiteral("stdin"));
+    };
+    if (interactive && violation.isEmpty() && realTime) {
+        // A real phone's events come while the tester types: the lines are read as they come,
+        // in the event loop, up to the end of the input.
+        QSocketNotifier input(STDIN_FILENO, QSocketNotifier::Read);
+        QByteArray pending;
+        int line = 0;
+        QObject::connect(&input, &QSocketNotifier::activated, &app, [&] {
+            // Not read again while a line plays (an advance waits in an event loop of its own).
+            input.setEnabled(false);
+            char buffer[4096];
+            const ssize_t got = ::read(STDIN_FILENO, buffer, sizeof buffer);
+            if (got > 0)
+                pending.append(buffer, int(got));
+            bool more = got > 0;
+            for (int end = pending.indexOf('\n'); end >= 0 || (!more && !pending.isEmpty());
+                 end = pending.indexOf('\n')) {
+                const QByteArray typed = end >= 0 ? pending.left(end) : pending;
+                pending.remove(0, end >= 0 ? end + 1 : pending.size());
+                if (!playTyped(typed, ++line)) {
+                    more = false;
+                    break;
+                }
+            }
+            if (more)
+                input.setEnabled(true);
+            else
+                app.quit();
+        });
+        app.exec();
+    } else if (interactive && violation.isEmpty()) {
         std::string typed;
         for (int line = 1; std::getline(std::cin, typed); ++line) {
-            Simulator::ScenarioStep step
-                    = Simulator::ScenarioStep::parse(QByteArray::fromStdString(typed), line);
-            const QString error = Simulator::ScenarioReader::check(step, runner.controller());
-            if (!error.isEmpty()) {
-                printError(QStringLiteral("stdin:%1: %2").arg(line).arg(error));
-                ++refusedSteps;
-                continue;
-            }
-            if (!play(step, QStringLiteral("stdin")))
+            if (!playTyped(QByteArray::fromStdString(typed), line))
                 break;
         }
     }

@@ -19,11 +19,15 @@
 #include <quorvel/statemachine.h>
 #include <taldris/hmiintentmanager.h>
 
+#include <QEventLoop>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QQmlContext>
 #include <QQmlEngine>
 #include <QQmlExpression>
+#include <QTimer>
+
+#include <limits>
 
 namespace Simulator {
 
@@ -280,9 +284,18 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
                     step.value("length").toInt());
         return QString();
     }
-    case ScenarioStep::Advance:
-        m_clock->advance(qint64(step.value("advance").toDouble()));
+    case ScenarioStep::Advance: {
+        const qint64 milliseconds = qint64(step.value("advance").toDouble());
+        if (!m_waitsInRealTime) {
+            m_clock->advance(milliseconds);
+            return QString();
+        }
+        QEventLoop wait;
+        QTimer::singleShot(int(qMin<qint64>(milliseconds, std::numeric_limits<int>::max())),
+                           &wait, &QEventLoop::quit);
+        wait.exec();
         return QString();
+    }
     default:
         return QString();
     }

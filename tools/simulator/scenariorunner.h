@@ -41,6 +41,10 @@ public:
     // against the hosted module. Empty: the scenario can be played. Runs no step.
     QList<ScenarioError> prepare(const QList<ScenarioStep> &steps);
 
+    // With a real phone and no window: an advance step waits that long in real time, events
+    // coming in meanwhile.
+    void setWaitsInRealTime(bool waits) { m_waitsInRealTime = waits; }
+
     // Plays one step that prepare() or ScenarioReader::check() accepted. A comment is echoed.
     void play(const ScenarioStep &step);
     // Ends the run: starts the machine if no step did.
@@ -89,6 +93,7 @@ private:
     bool m_started = false;
     bool m_startDeferred = false;
     bool m_withoutStatusBar = false;
+    bool m_waitsInRealTime = false;
     int m_checks = 0;
     int m_failures = 0;
     int m_stepErrors = 0;

@@ -106,9 +106,11 @@ QString timeText(const QDateTime &time)
 
 } // namespace
 
-SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent)
+SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent,
+                               CallCarrier carrier)
     : QObject(parent)
     , m_clock(clock)
+    , m_carrier(carrier)
     , m_dialTimer(new QTimer(this))
     , m_callClock(new QTimer(this))
 {
@@ -117,15 +119,18 @@ SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent)
     connect(m_dialTimer, &QTimer::timeout, this, &SimulatedPhone::callConnected);
     m_callClock->setInterval(1000);
     connect(m_callClock, &QTimer::timeout, this, &SimulatedPhone::publishCalls);
-    connect(phone(), &Mavrosk::PhoneSource::statusChanged, this, &SimulatedPhone::onStatusChanged);
     connect(Platform::Journal::instance(), &Platform::Journal::appended, this,
             &SimulatedPhone::onJournalEntry);
-    // Calls and messages that come from the phone's side are remembered once they settled.
-    connect(phone(), &Mavrosk::PhoneSource::incomingCallChanged, this, [this](bool ringing) {
-        QTimer::singleShot(0, this, [this, ringing] { onIncomingCallChanged(ringing); });
-    });
-    connect(phone(), &Mavrosk::PhoneSource::newTextMessageAlert, this,
-            [this] { QTimer::singleShot(0, this, &SimulatedPhone::onNewTextMessage); });
+    if (carrier == OwnCalls) {
+        connect(phone(), &Mavrosk::PhoneSource::statusChanged, this,
+                &SimulatedPhone::onStatusChanged);
+        // Calls and messages that come from the phone's side are remembered once they settled.
+        connect(phone(), &Mavrosk::PhoneSource::incomingCallChanged, this, [this](bool ringing) {
+            QTimer::singleShot(0, this, [this, ringing] { onIncomingCallChanged(ringing); });
+        });
+        connect(phone(), &Mavrosk::PhoneSource::newTextMessageAlert, this,
+                [this] { QTimer::singleShot(0, this, &SimulatedPhone::onNewTextMessage); });
+    }
 
     const int firstNames = int(std::size(FirstNames));
     for (int i = 0; i < ContactCount; ++i) {
@@ -217,6 +222,16 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     }
     if (!call.startsWith(QLatin1String("phone.")))
         return;
+    // A real phone's calls are its own: what they are and how they go is its to say.
+    static const QStringList callCommands
+            = {QStringLiteral("acceptIncomingCall"), QStringLiteral("rejectIncomingCall"),
+               QStringLiteral("stopAcceptingAttempts"), QStringLiteral("endCall"),
+               QStringLiteral("cancelRoamingCall"), QStringLiteral("dialNumber"),
+               QStringLiteral("dialRecentCall"), QStringLiteral("joinCalls"),
+               QStringLiteral("swapCall"), QStringLiteral("callForFixAlert"),
+               QStringLiteral("initiateSendTextMessage")};
+    if (m_carrier == RealPhoneCalls && callCommands.contains(command))
+        return;
 
     if (command == QLatin1String("acceptIncomingCall")) {
         const bool second = p->callConnected();
@@ -246,9 +261,7 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
         dial(args.value(0).toString());
     } else if (command == QLatin1String("dialRecentCall")) {
         // The row of the list the head unit shows, of the type it was downloaded with.
-        const int index = args.value(1).toInt();
-        dial(index >= 0 && index < m_downloadedCalls.size() ? m_downloadedCalls.at(index).number
-                                                            : QString());
+        dial(recentCallNumber(args.value(1).toInt()));
     } else if (command == QLatin1String("joinCalls")) {
         if (p->status() == TwoCalls)
             setPhone("status", TwoCallsJoined);
@@ -382,6 +395,22 @@ SimulatedPhone::Entry SimulatedPhone::caller(int index) const
     return m_contacts.at((index * 11 + 2) % m_contacts.size());
 }
 
+QString SimulatedPhone::contactName(const QString &number) const
+{
+    return whoHas(number).name;
+}
+
+QString SimulatedPhone::recentCallNumber(int row) const
+{
+    return row >= 0 && row < m_downloadedCalls.size() ? m_downloadedCalls.at(row).number
+                                                       : QString();
+}
+
+void SimulatedPhone::logCall(const QString &name, const QString &number, int type)
+{
+    logCall(Entry{name, number, {}, 0, {}, true}, type);
+}
+
 SimulatedPhone::Entry SimulatedPhone::whoHas(const QString &number) const
 {
     for (const Entry &contact : m_contacts) {
@@ -481,6 +510,17 @@ void SimulatedPhone::onNewTextMessage()
     message.text = !body.isEmpty() && (m_messages.isEmpty() || body != m_messages.first().text)
             ? body
             : QLatin1String(Texts[m_messages.size() % int(std::size(Texts))]);
+    addMessage(message);
+}
+
+void SimulatedPhone::receiveMessage(const QString &name, const QString &number,
+                                    const QString &text)
+{
+    addMessage(Entry{name, number, {}, 0, text, false});
+}
+
+void SimulatedPhone::addMessage(Entry message)
+{
     message.time = now();
     message.read = false;
     m_messages.prepend(message);

@@ -34,13 +34,27 @@ class SimulatedPhone : public QObject
 {
     Q_OBJECT
 public:
-    explicit SimulatedPhone(VirtualEventDispatcher *clock = nullptr, QObject *parent = nullptr);
+    // Who carries the calls and the texts that come in: the simulated phone itself, or a real
+    // phone's stack behind the bridge (oFono), for which it keeps only its lists: contacts, recent
+    // calls, the inbox, status alerts and the settings a hands-free link does not carry.
+    enum CallCarrier { OwnCalls, RealPhoneCalls };
+
+    explicit SimulatedPhone(VirtualEventDispatcher *clock = nullptr, QObject *parent = nullptr,
+                            CallCarrier carrier = OwnCalls);
     ~SimulatedPhone() override;
 
     // A phone that is paired and connected, with its contacts and messages already downloaded
     // and its recent calls ready to download: the values a head unit has a while after the phone
     // connected.
     void connectPhone();
+
+    // For a real phone's calls and texts: the contact with this number ("" when none has it), the
+    // number of a row of the recent calls the head unit holds ("" when there is no such row), a
+    // call to remember (1 missed, 2 received, 3 dialled) and a text that came in.
+    QString contactName(const QString &number) const;
+    QString recentCallNumber(int row) const;
+    void logCall(const QString &name, const QString &number, int type);
+    void receiveMessage(const QString &name, const QString &number, const QString &text);
 
     static constexpr int DialConnectDelay = 1000;
     static constexpr int ContactsDownloadDelay = 3000;
@@ -79,6 +93,7 @@ private:
     void swapCalls();
     void clearAlert(int alertId);
     void onNewTextMessage();
+    void addMessage(Entry message);
     void logCall(const Entry &caller, int type);
     void downloadContacts();
     void contactsDownloaded();
@@ -101,6 +116,7 @@ private:
     };
 
     VirtualEventDispatcher *m_clock;
+    CallCarrier m_carrier;
     QTimer *m_dialTimer;
     QTimer *m_callClock;
     QList<Call> m_activeCalls; // in the order they began
