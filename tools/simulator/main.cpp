@@ -570,8 +570,9 @@ int main(int argc, char *argv[])
         return play(step, QStringLiteral("stdin"));
     };
     if (interactive && violation.isEmpty() && realTime) {
-        // A real phone's events come while the tester types: the lines are read as they come,
-        // in the event loop, up to the end of the input.
+        // A real phone's events come while the tester types: the HMI runs, and the lines are read
+        // as they come, in the event loop, up to the end of the input.
+        runner.finish();
         QSocketNotifier input(STDIN_FILENO, QSocketNotifier::Read);
         QByteArray pending;
         int line = 0;

@@ -99,6 +99,8 @@ const ValueMapping Values[] = {
          "`org.ofono.Handsfree` interface)",
          "`BluetoothSource` `deviceConnected` (with `phoneDevice`, `selectedDevice` 0 and "
          "`deviceListCount` 1); oFono, the modem or the bus gone: false"},
+        {"the modem followed gone (oFono left, the modem removed, no longer powered or online)",
+         "`nonUserDeviceDisconnectReceived()`, then `deviceConnected` false, then the calls end"},
         {"`Handsfree` `BatteryChargeLevel` (0 to 5)", "`deviceBatteryLevel`, the same number"},
         {"`MessageManager` `IncomingMessage` (text, `Sender`)",
          "`textMessageSenderNumber`, `textMessageSenderName` (the contact's name), "
@@ -481,7 +483,8 @@ void OfonoPhone::dropModem(const QString &why)
     if (!m_modem.isEmpty()) {
         m_modem.clear();
         ++m_session;
-        // The link is lost first: the calls end with it.
+        // The link is lost, not ended by the driver, first: the calls end with it.
+        emit phone()->nonUserDeviceDisconnectReceived();
         setConnected(false, why);
         m_calls.clear();
         publishCalls();
