@@ -98,7 +98,7 @@ const ValueMapping Values[] = {
         {"`Modem` `Powered` and `Online` (and, for a hands-free modem of `Type` \"hfp\", its "
          "`org.ofono.Handsfree` interface)",
          "`BluetoothSource` `deviceConnected` (with `phoneDevice`, `selectedDevice` 0 and "
-         "`deviceListCount` 1); oFono, the modem or the bus gone: false"},
+         "`deviceListCount` 1); oFono or the modem gone: false"},
         {"the modem followed gone (oFono left, the modem removed, no longer powered or online)",
          "`nonUserDeviceDisconnectReceived()`, then `deviceConnected` false, then the calls end"},
         {"`Handsfree` `BatteryChargeLevel` (0 to 5)", "`deviceBatteryLevel`, the same number"},
@@ -173,7 +173,7 @@ const char *situationText(Situation situation)
     case Situation::Always:
         break;
     }
-    return "";
+    return "always";
 }
 
 const char *targetText(Target target)
