@@ -54,6 +54,13 @@ const char *const SetState = "def set_state(call, state):\n"
                              "    call.EmitSignal('org.ofono.VoiceCall', 'PropertyChanged', 'sv', "
                              "['State', value])\n";
 
+// A call hung up goes as oFono has it go: removed, and said so by the modem (the template's
+// dialled calls say it from the call they no longer have).
+const char *const Hangup = "self.parent.calls.remove(self._object_path)\n"
+                           "self.parent.RemoveObject(self._object_path)\n"
+                           "self.parent.EmitSignal(\"org.ofono.VoiceCallManager\", \"CallRemoved\", "
+                           "\"o\", [dbus.ObjectPath(self._object_path)])";
+
 struct MockMethod
 {
     const char *interface;
@@ -75,11 +82,7 @@ QList<MockMethod> modemExtensions()
             R"(value = dbus.String("active", variant_level=1)\n)"
             R"(self.Set("org.ofono.VoiceCall", "State", value)\n)"
             R"(self.EmitSignal("org.ofono.VoiceCall", "PropertyChanged", "sv", ["State", value]))");
-    const QString hangup = QStringLiteral(
-            R"(self.parent.calls.remove(self._object_path)\n)"
-            R"(self.parent.RemoveObject(self._object_path)\n)"
-            R"(self.parent.EmitSignal("org.ofono.VoiceCallManager", "CallRemoved", "o", )"
-            R"([dbus.ObjectPath(self._object_path)]))");
+    const QString hangup = QString::fromLatin1(Hangup).replace(QLatin1Char('\n'), QLatin1String("\\n"));
     const QString ring = QStringLiteral(
             "self.rung = getattr(self, 'rung', 0) + 1\n"
             "path = self._object_path + '/incoming' + str(self.rung)\n"
@@ -120,6 +123,9 @@ QList<MockMethod> modemExtensions()
                                       "self.RemoveObject(found[0])\n"
                                       "self.EmitSignal('org.ofono.VoiceCallManager', "
                                       "'CallRemoved', 'o', [dbus.ObjectPath(found[0])])\n")},
+            {"org.freedesktop.DBus.Mock", "SetBattery", "y", "",
+             QStringLiteral("self.EmitSignal('org.ofono.Handsfree', 'PropertyChanged', 'sv', "
+                            "['BatteryChargeLevel', dbus.Byte(args[0], variant_level=1)])\n")},
             {"org.freedesktop.DBus.Mock", "SetAnswerDelay", "d", "",
              QStringLiteral("self.answer_delay = args[0]\n")},
             {"org.ofono.VoiceCallManager", "SwapCalls", "", "",
@@ -285,8 +291,9 @@ bool tst_Ofono::mockSaw(const QString &method, const QString &number)
 // One step of the phone's side, oFono's or the driver's:
 //   ring NUMBER [NAME] | wait NUMBER     a call rings in (beside a connected call: waiting)
 //   far STATE NUMBER | hangup NUMBER      the far end moves the call, or hangs up
-//   roam | text NUMBER WORDS... | slow-answer | ofono-leaves | ofono-returns
-//   key K (a short press) | send WORDS... (the reply to the last sender)
+//   roam | battery LEVEL | text NUMBER WORDS... | slow-answer | ofono-leaves | ofono-returns
+//   key K (a tap) | send WORDS... (the reply to the last sender) | dial NUMBER
+//   set SOURCE.PROPERTY=VALUE (what the driver set)
 void tst_Ofono::play(const QString &step)
 {
     const QStringList words = step.split(QLatin1Char(' '));
@@ -315,6 +322,15 @@ void tst_Ofono::play(const QString &step)
                       QStringLiteral("IncomingMessage"), QStringLiteral("sa{sv}"),
                       QVariantList{QVariant::fromValue(QDBusVariant(rest)),
                                    QVariant::fromValue(QDBusVariant(info))}});
+    } else if (verb == QLatin1String("battery")) {
+        reply = mock(Modem, MockInterface, QStringLiteral("SetBattery"),
+                     {QVariant::fromValue(uchar(words.value(1).toUInt()))});
+    } else if (verb == QLatin1String("dial")) {
+        GlobalHmi::phone()->dialNumber(words.value(1));
+        QTRY_VERIFY_WITH_TIMEOUT(!callPath(words.value(1)).isEmpty(), Patience);
+        reply = mock(callPath(words.value(1)), MockInterface, QStringLiteral("AddMethod"),
+                     {QStringLiteral("org.ofono.VoiceCall"), QStringLiteral("Hangup"), QString(),
+                      QString(), QLatin1String(Hangup)});
     } else if (verb == QLatin1String("slow-answer")) {
         reply = mock(Modem, MockInterface, QStringLiteral("SetAnswerDelay"), {3.0});
     } else if (verb == QLatin1String("ofono-leaves")) {
@@ -324,8 +340,13 @@ void tst_Ofono::play(const QString &step)
         startOfono();
         return;
     } else if (verb == QLatin1String("key")) {
-        Mavrosk::KeySource::instance()->sendKeyEvent(words.value(1).toInt(), 2);
+        // A tap: press, then short press.
+        for (int kind : {1, 2})
+            Mavrosk::KeySource::instance()->sendKeyEvent(words.value(1).toInt(), kind);
         TestSupport::processUntilIdle();
+        return;
+    } else if (verb == QLatin1String("set")) {
+        QVERIFY2(TestSupport::setBridgeValue(words.value(1)), qPrintable(step));
         return;
     } else if (verb == QLatin1String("send")) {
         GlobalHmi::phone()->setReplyTextSelected(words.mid(1).join(QLatin1Char(' ')));
@@ -416,9 +437,27 @@ void tst_Ofono::realPhone_data()
                            QStringLiteral("? phone.incomingCall=false"),
                            QStringLiteral("? nopopup IncomingCall"), QStringLiteral("? popup MissedCallPopup")}
             << QStringList();
-    QTest::newRow("roaming shows its warning")
+    QTest::newRow("dialled: the far end rings, answers, and the end key hangs up")
+            << QStringList{QStringLiteral("dial %1").arg(ben),
+                           QStringLiteral("? call %1 dialing").arg(ben),
+                           QStringLiteral("? phone.status=3"),
+                           QStringLiteral("? phone.dialingInProgress=true"),
+                           QStringLiteral("far alerting %1").arg(ben),
+                           QStringLiteral("? call %1 dialing").arg(ben),
+                           QStringLiteral("far active %1").arg(ben),
+                           QStringLiteral("? phone.status=7"),
+                           QStringLiteral("? state PhoneCallCmp"),
+                           QStringLiteral("key 80"),
+                           QStringLiteral("? phone.status=0"),
+                           QStringLiteral("? nostate PhoneCallCmp")}
+            << QStringList();
+    QTest::newRow("roaming shows its warning, the battery its level")
             << QStringList{QStringLiteral("roam"), QStringLiteral("? phone.roaming=true"),
-                           QStringLiteral("? popup RoamingWarning")}
+                           QStringLiteral("? popup RoamingWarning"),
+                           QStringLiteral("set phone.lowBatteryNotification=true"),
+                           QStringLiteral("battery 1"),
+                           QStringLiteral("? phone.deviceBatteryLevel=1"),
+                           QStringLiteral("? popup BatteryLow")}
             << QStringList();
     QTest::newRow("a text arrives and is answered")
             << QStringList{QStringLiteral("text %1 See you at eight?").arg(ben),

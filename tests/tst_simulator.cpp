@@ -168,6 +168,12 @@ void SimulatorTest::scenarioFile_data()
     row("invariants in a soak",
         invariants + QStringList{QStringLiteral("--random"), QStringLiteral("1")}, {}, {}, 2,
         QStringLiteral("--random checks the invariants anyway"));
+    row("modem without oFono", {QStringLiteral("--modem"), QStringLiteral("/hfp/phone")}, open,
+        {}, 2, QStringLiteral("--dbus-address and --modem go with --phone ofono"));
+    row("oFono in a soak",
+        {QStringLiteral("--phone"), QStringLiteral("ofono"), QStringLiteral("--random"),
+         QStringLiteral("1")},
+        {}, {}, 2, QStringLiteral("--phone ofono runs in real time"));
     // Without a display (no X server, the offscreen platform not chosen) or without the window
     // built in, --window says so and exits 2 instead of aborting.
     row("window without a display", {QStringLiteral("--window")}, {}, {}, 2,
