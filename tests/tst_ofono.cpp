@@ -28,16 +28,15 @@ const QString CallManager = QStringLiteral("org.ofono.VoiceCallManager");
 // Debian's own Python, which has the dbusmock module, whatever else is on the path.
 const QString Python = QStringLiteral(HMIPHONE_PYTHON3);
 // The bus of the suite's own: a session bus that needs no configuration of the system's.
-const char *const BusConfiguration
-        = "<busconfig>\n"
-          "  <type>session</type>\n"
-          "  <listen>unix:tmpdir=%1</listen>\n"
-          "  <policy context=\"default\">\n"
-          "    <allow send_destination=\"*\" eavesdrop=\"true\"/>\n"
-          "    <allow eavesdrop=\"true\"/>\n"
-          "    <allow own=\"*\"/>\n"
-          "  </policy>\n"
-          "</busconfig>\n";
+const char *const BusConfiguration = "<busconfig>\n"
+                                     "  <type>session</type>\n"
+                                     "  <listen>unix:tmpdir=%1</listen>\n"
+                                     "  <policy context=\"default\">\n"
+                                     "    <allow send_destination=\"*\" eavesdrop=\"true\"/>\n"
+                                     "    <allow eavesdrop=\"true\"/>\n"
+                                     "    <allow own=\"*\"/>\n"
+                                     "  </policy>\n"
+                                     "</busconfig>\n";
 constexpr int Patience = 5000;
 
 // What the template lacks, as dbusmock code run in the mock (self: the object, args: the
@@ -56,10 +55,11 @@ const char *const SetState = "def set_state(call, state):\n"
 
 // A call hung up goes as oFono has it go: removed, and said so by the modem (the template's
 // dialled calls say it from the call they no longer have).
-const char *const Hangup = "self.parent.calls.remove(self._object_path)\n"
-                           "self.parent.RemoveObject(self._object_path)\n"
-                           "self.parent.EmitSignal(\"org.ofono.VoiceCallManager\", \"CallRemoved\", "
-                           "\"o\", [dbus.ObjectPath(self._object_path)])";
+const char *const Hangup
+        = "self.parent.calls.remove(self._object_path)\n"
+          "self.parent.RemoveObject(self._object_path)\n"
+          "self.parent.EmitSignal(\"org.ofono.VoiceCallManager\", \"CallRemoved\", "
+          "\"o\", [dbus.ObjectPath(self._object_path)])";
 
 struct MockMethod
 {
@@ -82,24 +82,27 @@ QList<MockMethod> modemExtensions()
             R"(value = dbus.String("active", variant_level=1)\n)"
             R"(self.Set("org.ofono.VoiceCall", "State", value)\n)"
             R"(self.EmitSignal("org.ofono.VoiceCall", "PropertyChanged", "sv", ["State", value]))");
-    const QString hangup = QString::fromLatin1(Hangup).replace(QLatin1Char('\n'), QLatin1String("\\n"));
-    const QString ring = QStringLiteral(
-            "self.rung = getattr(self, 'rung', 0) + 1\n"
-            "path = self._object_path + '/incoming' + str(self.rung)\n"
-            "self.AddObject(path, 'org.ofono.VoiceCall', {\n"
-            "    'State': dbus.String(args[2], variant_level=1),\n"
-            "    'LineIdentification': dbus.String(args[0], variant_level=1),\n"
-            "    'Name': dbus.String(args[1], variant_level=1),\n"
-            "    'Multiparty': dbus.Boolean(False, variant_level=1)}, [\n"
-            "    ('GetProperties', '', 'a{sv}', 'ret = self.GetAll(\"org.ofono.VoiceCall\")'),\n"
-            "    ('Answer', '', '', '%1'),\n"
-            "    ('Hangup', '', '', '%2')])\n"
-            "objects[path].parent = self\n"
-            "self.calls.append(path)\n"
-            "self.EmitSignal('org.ofono.VoiceCallManager', 'CallAdded', 'oa{sv}', "
-            "[dbus.ObjectPath(path), objects[path].GetAll('org.ofono.VoiceCall')])\n"
-            "ret = dbus.ObjectPath(path)\n")
-                                 .arg(answer, hangup);
+    const QString hangup
+            = QString::fromLatin1(Hangup).replace(QLatin1Char('\n'), QLatin1String("\\n"));
+    const QString ring
+            = QStringLiteral(
+                      "self.rung = getattr(self, 'rung', 0) + 1\n"
+                      "path = self._object_path + '/incoming' + str(self.rung)\n"
+                      "self.AddObject(path, 'org.ofono.VoiceCall', {\n"
+                      "    'State': dbus.String(args[2], variant_level=1),\n"
+                      "    'LineIdentification': dbus.String(args[0], variant_level=1),\n"
+                      "    'Name': dbus.String(args[1], variant_level=1),\n"
+                      "    'Multiparty': dbus.Boolean(False, variant_level=1)}, [\n"
+                      "    ('GetProperties', '', 'a{sv}', 'ret = "
+                      "self.GetAll(\"org.ofono.VoiceCall\")'),\n"
+                      "    ('Answer', '', '', '%1'),\n"
+                      "    ('Hangup', '', '', '%2')])\n"
+                      "objects[path].parent = self\n"
+                      "self.calls.append(path)\n"
+                      "self.EmitSignal('org.ofono.VoiceCallManager', 'CallAdded', 'oa{sv}', "
+                      "[dbus.ObjectPath(path), objects[path].GetAll('org.ofono.VoiceCall')])\n"
+                      "ret = dbus.ObjectPath(path)\n")
+                      .arg(answer, hangup);
     // Every call in state `from` goes to state `to`.
     auto move = [&setState](const char *moves) {
         return setState
@@ -206,15 +209,17 @@ void tst_Ofono::startOfono()
     environment.insert(QStringLiteral("DBUS_SYSTEM_BUS_ADDRESS"), m_address);
     m_ofono.setProcessEnvironment(environment);
     m_ofono.setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    m_ofono.start(Python, {QStringLiteral("-m"), QStringLiteral("dbusmock"),
-                           QStringLiteral("--template"), QStringLiteral("ofono")});
+    m_ofono.start(Python,
+                  {QStringLiteral("-m"), QStringLiteral("dbusmock"), QStringLiteral("--template"),
+                   QStringLiteral("ofono")});
     QVERIFY(m_ofono.waitForStarted());
     QTRY_VERIFY_WITH_TIMEOUT(m_connection.interface()->isServiceRegistered(Ofono), Patience);
-    for (const MockMethod &method : modemExtensions()) {
-        const QDBusMessage reply = mock(Modem, MockInterface, QStringLiteral("AddMethod"),
-                                        {QLatin1String(method.interface),
-                                         QLatin1String(method.name), QLatin1String(method.in),
-                                         QLatin1String(method.out), method.code});
+    const QList<MockMethod> extensions = modemExtensions();
+    for (const MockMethod &method : extensions) {
+        const QDBusMessage reply
+                = mock(Modem, MockInterface, QStringLiteral("AddMethod"),
+                       {QLatin1String(method.interface), QLatin1String(method.name),
+                        QLatin1String(method.in), QLatin1String(method.out), method.code});
         QVERIFY2(reply.type() == QDBusMessage::ReplyMessage, qPrintable(reply.errorMessage()));
     }
 }
@@ -250,8 +255,8 @@ void tst_Ofono::tearDown()
     m_hmi.reset();
 }
 
-QDBusMessage tst_Ofono::mock(const QString &path, const QString &interface,
-                             const QString &method, const QVariantList &args)
+QDBusMessage tst_Ofono::mock(const QString &path, const QString &interface, const QString &method,
+                             const QVariantList &args)
 {
     QDBusMessage message = QDBusMessage::createMethodCall(Ofono, path, interface, method);
     message.setArguments(args);
@@ -283,7 +288,8 @@ bool tst_Ofono::mockSaw(const QString &method, const QString &number)
     const QString path = number.isEmpty() ? Modem : callPath(number);
     if (path.isEmpty())
         return false;
-    const QDBusMessage reply = mock(path, MockInterface, QStringLiteral("GetMethodCalls"), {method});
+    const QDBusMessage reply
+            = mock(path, MockInterface, QStringLiteral("GetMethodCalls"), {method});
     return reply.type() == QDBusMessage::ReplyMessage
             && !qdbus_cast<QVariantList>(reply.arguments().value(0)).isEmpty();
 }
@@ -318,8 +324,8 @@ void tst_Ofono::play(const QString &step)
     } else if (verb == QLatin1String("text")) {
         const QVariantMap info{{QStringLiteral("Sender"), words.value(1)}};
         reply = mock(Modem, MockInterface, QStringLiteral("EmitSignal"),
-                     {QStringLiteral("org.ofono.MessageManager"),
-                      QStringLiteral("IncomingMessage"), QStringLiteral("sa{sv}"),
+                     {QStringLiteral("org.ofono.MessageManager"), QStringLiteral("IncomingMessage"),
+                      QStringLiteral("sa{sv}"),
                       QVariantList{QVariant::fromValue(QDBusVariant(rest)),
                                    QVariant::fromValue(QDBusVariant(info))}});
     } else if (verb == QLatin1String("battery")) {
@@ -382,7 +388,8 @@ bool tst_Ofono::holds(const QString &expectation)
         return false;
     }
     const QString property = what.section(QLatin1Char('='), 0, 0);
-    for (Mavrosk::DataSource *source : Mavrosk::DataSource::sources()) {
+    const QList<Mavrosk::DataSource *> sources = Mavrosk::DataSource::sources();
+    for (Mavrosk::DataSource *source : sources) {
         if (source->shortName() == property.section(QLatin1Char('.'), 0, 0))
             return source->property(property.section(QLatin1Char('.'), 1).toLatin1().constData())
                            .toString()
@@ -432,10 +439,12 @@ void tst_Ofono::realPhone_data()
                            QStringLiteral("? call %1 held").arg(ben)}
             << QStringList();
     QTest::newRow("a call that rings out unanswered is missed")
-            << QStringList{QStringLiteral("ring %1").arg(ben), QStringLiteral("? popup IncomingCall"),
+            << QStringList{QStringLiteral("ring %1").arg(ben),
+                           QStringLiteral("? popup IncomingCall"),
                            QStringLiteral("hangup %1").arg(ben),
                            QStringLiteral("? phone.incomingCall=false"),
-                           QStringLiteral("? nopopup IncomingCall"), QStringLiteral("? popup MissedCallPopup")}
+                           QStringLiteral("? nopopup IncomingCall"),
+                           QStringLiteral("? popup MissedCallPopup")}
             << QStringList();
     QTest::newRow("dialled: the far end rings, answers, and the end key hangs up")
             << QStringList{QStringLiteral("dial %1").arg(ben),
@@ -452,7 +461,8 @@ void tst_Ofono::realPhone_data()
                            QStringLiteral("? nostate PhoneCallCmp")}
             << QStringList();
     QTest::newRow("roaming shows its warning, the battery its level")
-            << QStringList{QStringLiteral("roam"), QStringLiteral("? phone.roaming=true"),
+            << QStringList{QStringLiteral("roam"),
+                           QStringLiteral("? phone.roaming=true"),
                            QStringLiteral("? popup RoamingWarning"),
                            QStringLiteral("set phone.lowBatteryNotification=true"),
                            QStringLiteral("battery 1"),
@@ -464,7 +474,8 @@ void tst_Ofono::realPhone_data()
                            QStringLiteral("? phone.textMessageSenderNumber=%1").arg(ben),
                            QStringLiteral("? phone.textMessageBody=See you at eight?"),
                            QStringLiteral("? popup NewTextMessageAlert2"),
-                           QStringLiteral("send On my way."), QStringLiteral("? saw SendMessage"),
+                           QStringLiteral("send On my way."),
+                           QStringLiteral("? saw SendMessage"),
                            QStringLiteral("? phone.sendMessageStatus=2")}
             << QStringList();
     QTest::newRow("oFono goes in a call and comes back")
@@ -519,9 +530,8 @@ void tst_Ofono::simulatorWaitsForOfono()
         seen += simulator.readAllStandardOutput();
         return seen.contains(text);
     };
-    QTRY_VERIFY_WITH_TIMEOUT(
-            saw(R"("what":"no phone connected: oFono is not on the bus")"),
-            Patience);
+    QTRY_VERIFY_WITH_TIMEOUT(saw(R"("what":"no phone connected: oFono is not on the bus")"),
+                             Patience);
 
     startOfono();
     QTRY_VERIFY_WITH_TIMEOUT(saw(R"("what":"phone connected: /ril_0)"), Patience);
@@ -546,9 +556,10 @@ void tst_Ofono::readmeHasTheMapping()
     const int from = text.indexOf(begin);
     const int to = text.indexOf(end);
     QVERIFY2(from >= 0 && to > from, "the README marks its oFono mapping");
-    QVERIFY2(text.mid(from + begin.size(), to - from - begin.size()).trimmed()
-                     == Simulator::OfonoPhone::mappingMarkdown().trimmed(),
-             "the README's oFono mapping is not the code's: hmiphone-sim --ofono-mapping writes it");
+    QVERIFY2(
+            text.mid(from + begin.size(), to - from - begin.size()).trimmed()
+                    == Simulator::OfonoPhone::mappingMarkdown().trimmed(),
+            "the README's oFono mapping is not the code's: hmiphone-sim --ofono-mapping writes it");
 }
 
 QTEST_GUILESS_MAIN(tst_Ofono)

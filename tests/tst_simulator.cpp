@@ -168,8 +168,8 @@ void SimulatorTest::scenarioFile_data()
     row("invariants in a soak",
         invariants + QStringList{QStringLiteral("--random"), QStringLiteral("1")}, {}, {}, 2,
         QStringLiteral("--random checks the invariants anyway"));
-    row("modem without oFono", {QStringLiteral("--modem"), QStringLiteral("/hfp/phone")}, open,
-        {}, 2, QStringLiteral("--dbus-address and --modem go with --phone ofono"));
+    row("modem without oFono", {QStringLiteral("--modem"), QStringLiteral("/hfp/phone")}, open, {},
+        2, QStringLiteral("--dbus-address and --modem go with --phone ofono"));
     row("oFono in a soak",
         {QStringLiteral("--phone"), QStringLiteral("ofono"), QStringLiteral("--random"),
          QStringLiteral("1")},

@@ -129,8 +129,8 @@ struct CommandMapping
 
 // The first row of a command whose situation holds is the one sent.
 const CommandMapping Commands[] = {
-        {"acceptIncomingCall", Situation::CallIncoming, Target::RingingCall, "VoiceCall",
-         "Answer", Argument::None, Failure::AcceptingFailed},
+        {"acceptIncomingCall", Situation::CallIncoming, Target::RingingCall, "VoiceCall", "Answer",
+         Argument::None, Failure::AcceptingFailed},
         {"acceptIncomingCall", Situation::WaitingBesideOne, Target::Modem, "VoiceCallManager",
          "HoldAndAnswer", Argument::None, Failure::AcceptingFailed},
         {"acceptIncomingCall", Situation::WaitingBesideTwo, Target::Modem, "VoiceCallManager",
@@ -153,8 +153,8 @@ const CommandMapping Commands[] = {
          Argument::None, Failure::Logged},
         {"joinCalls", Situation::Always, Target::Modem, "VoiceCallManager", "CreateMultiparty",
          Argument::None, Failure::Logged},
-        {"dialPadKeyTonePressed", Situation::Always, Target::Modem, "VoiceCallManager",
-         "SendTones", Argument::Tone, Failure::Logged},
+        {"dialPadKeyTonePressed", Situation::Always, Target::Modem, "VoiceCallManager", "SendTones",
+         Argument::Tone, Failure::Logged},
         {"initiateSendTextMessage", Situation::Always, Target::Modem, "MessageManager",
          "SendMessage", Argument::Reply, Failure::SendingFailed},
 };
@@ -366,18 +366,20 @@ void OfonoPhone::connectToBus()
 
 void OfonoPhone::requestModems()
 {
-    call(QStringLiteral("/"), ManagerInterface, QStringLiteral("GetModems"), {},
-         [this](const QDBusMessage &reply) {
-             m_modems.clear();
-             for (const auto &modem : objectsOf(reply))
-                 m_modems.append({modem.first, modem.second});
-             chooseModem();
-         },
-         [this](const QString &error) {
-             // Not there yet: the watcher says when it comes.
-             qCInfo(ofonoLog).noquote() << error;
-             setConnected(false, QStringLiteral("oFono is not on the bus"));
-         });
+    call(
+            QStringLiteral("/"), ManagerInterface, QStringLiteral("GetModems"), {},
+            [this](const QDBusMessage &reply) {
+                m_modems.clear();
+                const auto modems = objectsOf(reply);
+                for (const auto &modem : modems)
+                    m_modems.append({modem.first, modem.second});
+                chooseModem();
+            },
+            [this](const QString &error) {
+                // Not there yet: the watcher says when it comes.
+                qCInfo(ofonoLog).noquote() << error;
+                setConnected(false, QStringLiteral("oFono is not on the bus"));
+            });
 }
 
 void OfonoPhone::ofonoLeft()
@@ -413,8 +415,9 @@ bool OfonoPhone::usable(const Modem &modem) const
         return false;
     // A hands-free modem is a phone once its hands-free profile is connected.
     return properties.value(QStringLiteral("Type")).toString() != QLatin1String("hfp")
-            || properties.value(QStringLiteral("Interfaces")).toStringList().contains(
-                    HandsfreeInterface);
+            || properties.value(QStringLiteral("Interfaces"))
+                       .toStringList()
+                       .contains(HandsfreeInterface);
 }
 
 bool OfonoPhone::isFollowed(const QDBusMessage &message) const
@@ -433,7 +436,7 @@ void OfonoPhone::chooseModem()
               });
     if (chosen == m_modems.cend()) {
         setConnected(false,
-                     m_modems.isEmpty()      ? QStringLiteral("oFono has no modem")
+                     m_modems.isEmpty() ? QStringLiteral("oFono has no modem")
                              : m_wantedModem.isEmpty()
                              ? QStringLiteral("no modem is powered and online")
                              : QStringLiteral("the modem %1 is not there, or not powered and "
@@ -458,7 +461,8 @@ void OfonoPhone::readModem()
     call(m_modem, CallManagerInterface, QStringLiteral("GetCalls"), {},
          [this](const QDBusMessage &reply) {
              m_calls.clear();
-             for (const auto &call : objectsOf(reply))
+             const auto calls = objectsOf(reply);
+             for (const auto &call : calls)
                  addCall(call.first, call.second);
              publishCalls();
          });
@@ -566,7 +570,8 @@ void OfonoPhone::addCall(const QString &path, const QVariantMap &properties)
     call.path = path;
     for (auto it = properties.cbegin(); it != properties.cend(); ++it)
         updateCall(call, it.key(), it.value());
-    call.incoming = call.state == QLatin1String("incoming") || call.state == QLatin1String("waiting");
+    call.incoming
+            = call.state == QLatin1String("incoming") || call.state == QLatin1String("waiting");
     if (call.name.isEmpty() && m_lists)
         call.name = m_lists->contactName(call.number);
     m_calls.erase(std::remove_if(m_calls.begin(), m_calls.end(),
@@ -626,12 +631,12 @@ void OfonoPhone::publishCalls()
             ++connected;
             joined += call.multiparty ? 1 : 0;
         }
-        rows.append(QVariantMap{
-                {QStringLiteral("name"), call.name},
-                {QStringLiteral("number"), call.number},
-                {QStringLiteral("callState"), QLatin1String(mapping->callList)},
-                {QStringLiteral("duration"),
-                 call.connectedAt < 0 ? 0 : int((nowMs() - call.connectedAt) / 1000)}});
+        rows.append(
+                QVariantMap{{QStringLiteral("name"), call.name},
+                            {QStringLiteral("number"), call.number},
+                            {QStringLiteral("callState"), QLatin1String(mapping->callList)},
+                            {QStringLiteral("duration"),
+                             call.connectedAt < 0 ? 0 : int((nowMs() - call.connectedAt) / 1000)}});
     }
     // Call status values of the bridge.
     const int status = dialling ? (connected > 0 ? 4 : 3)
@@ -750,7 +755,7 @@ void OfonoPhone::command(const QString &command, const QVariantList &args)
     const QString what = QStringLiteral("%1 (%2)").arg(command, m_modem);
     const bool noNetwork = withoutNetwork(m_networkStatus);
     const Failure failure = mapping ? mapping->failure : Failure::Logged;
-    auto failed = [this, what, failure, noNetwork](const QString &error) {
+    auto failed = [what, failure, noNetwork](const QString &error) {
         qCWarning(ofonoLog).noquote() << what << "failed:" << error;
         switch (failure) {
         case Failure::DialingFailed:
@@ -832,12 +837,13 @@ void OfonoPhone::command(const QString &command, const QVariantList &args)
 
     const QString interface = QStringLiteral("org.ofono.") + QLatin1String(mapping->interface);
     const QString method = QLatin1String(mapping->method);
-    call(path, interface, method, arguments,
-         [method](const QDBusMessage &) {
-             if (method == QLatin1String("SendMessage"))
-                 setPhone("sendMessageStatus", 2);
-         },
-         failed);
+    call(
+            path, interface, method, arguments,
+            [method](const QDBusMessage &) {
+                if (method == QLatin1String("SendMessage"))
+                    setPhone("sendMessageStatus", 2);
+            },
+            failed);
 }
 
 void OfonoPhone::call(const QString &path, const QString &interface, const QString &method,
@@ -850,8 +856,8 @@ void OfonoPhone::call(const QString &path, const QString &interface, const QStri
     auto *watcher = new QDBusPendingCallWatcher(m_bus.asyncCall(message, m_callTimeout), this);
     const int session = m_session;
     connect(watcher, &QDBusPendingCallWatcher::finished, this,
-            [this, session, replied, failed, path, interface, method](
-                    QDBusPendingCallWatcher *finished) {
+            [this, session, replied, failed, path, interface,
+             method](QDBusPendingCallWatcher *finished) {
                 finished->deleteLater();
                 // An answer about a modem no longer followed is of no use.
                 if (session != m_session)
@@ -862,9 +868,9 @@ void OfonoPhone::call(const QString &path, const QString &interface, const QStri
                     return;
                 }
                 const QDBusError error = finished->error();
-                const QString text = QStringLiteral("%1.%2 on %3: %4 (%5)")
-                                             .arg(interface, method, path, error.name(),
-                                                  error.message());
+                const QString text
+                        = QStringLiteral("%1.%2 on %3: %4 (%5)")
+                                  .arg(interface, method, path, error.name(), error.message());
                 if (failed)
                     failed(text);
                 else

@@ -291,8 +291,8 @@ QString ScenarioRunner::apply(const ScenarioStep &step)
             return QString();
         }
         QEventLoop wait;
-        QTimer::singleShot(int(qMin<qint64>(milliseconds, std::numeric_limits<int>::max())),
-                           &wait, &QEventLoop::quit);
+        QTimer::singleShot(int(qMin<qint64>(milliseconds, std::numeric_limits<int>::max())), &wait,
+                           &QEventLoop::quit);
         wait.exec();
         return QString();
     }

@@ -106,8 +106,7 @@ QString timeText(const QDateTime &time)
 
 } // namespace
 
-SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent,
-                               CallCarrier carrier)
+SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent, CallCarrier carrier)
     : QObject(parent)
     , m_clock(clock)
     , m_carrier(carrier)
@@ -223,13 +222,17 @@ void SimulatedPhone::answer(const QString &call, const QVariantList &args)
     if (!call.startsWith(QLatin1String("phone.")))
         return;
     // A real phone's calls are its own: what they are and how they go is its to say.
-    static const QStringList callCommands
-            = {QStringLiteral("acceptIncomingCall"), QStringLiteral("rejectIncomingCall"),
-               QStringLiteral("stopAcceptingAttempts"), QStringLiteral("endCall"),
-               QStringLiteral("cancelRoamingCall"), QStringLiteral("dialNumber"),
-               QStringLiteral("dialRecentCall"), QStringLiteral("joinCalls"),
-               QStringLiteral("swapCall"), QStringLiteral("callForFixAlert"),
-               QStringLiteral("initiateSendTextMessage")};
+    static const QStringList callCommands = {QStringLiteral("acceptIncomingCall"),
+                                             QStringLiteral("rejectIncomingCall"),
+                                             QStringLiteral("stopAcceptingAttempts"),
+                                             QStringLiteral("endCall"),
+                                             QStringLiteral("cancelRoamingCall"),
+                                             QStringLiteral("dialNumber"),
+                                             QStringLiteral("dialRecentCall"),
+                                             QStringLiteral("joinCalls"),
+                                             QStringLiteral("swapCall"),
+                                             QStringLiteral("callForFixAlert"),
+                                             QStringLiteral("initiateSendTextMessage")};
     if (m_carrier == RealPhoneCalls && callCommands.contains(command))
         return;
 
@@ -403,7 +406,7 @@ QString SimulatedPhone::contactName(const QString &number) const
 QString SimulatedPhone::recentCallNumber(int row) const
 {
     return row >= 0 && row < m_downloadedCalls.size() ? m_downloadedCalls.at(row).number
-                                                       : QString();
+                                                      : QString();
 }
 
 void SimulatedPhone::logCall(const QString &name, const QString &number, int type)
@@ -513,8 +516,7 @@ void SimulatedPhone::onNewTextMessage()
     addMessage(message);
 }
 
-void SimulatedPhone::receiveMessage(const QString &name, const QString &number,
-                                    const QString &text)
+void SimulatedPhone::receiveMessage(const QString &name, const QString &number, const QString &text)
 {
     addMessage(Entry{name, number, {}, 0, text, false});
 }
