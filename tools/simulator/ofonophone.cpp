@@ -323,15 +323,20 @@ void OfonoPhone::connectToBus()
             ? QDBusConnection::connectToBus(QDBusConnection::SystemBus, ConnectionName)
             : QDBusConnection::connectToBus(m_busAddress, ConnectionName);
     if (!m_bus.isConnected()) {
-        const QString why = QStringLiteral("no D-Bus at %1 (%2); trying again")
+        const QString why = QStringLiteral("cannot reach %1 (%2); trying again every %3 s")
                                     .arg(m_busAddress.isEmpty() ? QStringLiteral("the system bus")
                                                                 : m_busAddress,
-                                         m_bus.lastError().message());
-        qCWarning(ofonoLog).noquote() << why;
+                                         m_bus.lastError().message())
+                                    .arg(BusRetryInterval / 1000);
+        // Said once, not at every try.
+        if (why != m_busProblem)
+            qCWarning(ofonoLog).noquote() << why;
+        m_busProblem = why;
         setConnected(false, why);
         m_retry->start();
         return;
     }
+    m_busProblem.clear();
 
     delete m_watcher;
     m_watcher = new QDBusServiceWatcher(Service, m_bus,

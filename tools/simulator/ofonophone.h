@@ -141,6 +141,7 @@ private:
     int m_session = 0;
     bool m_connected = false;
     QString m_connection; // what was said of the connection last
+    QString m_busProblem; // why the bus could not be reached at the last try
 };
 
 } // namespace Simulator
