@@ -465,8 +465,17 @@ void OfonoPhone::readModem()
 {
     call(m_modem, CallManagerInterface, QStringLiteral("GetCalls"), {},
          [this](const QDBusMessage &reply) {
-             m_calls.clear();
+             // The calls of now: those gone meanwhile go, those known keep what was seen of them.
              const auto calls = objectsOf(reply);
+             m_calls.erase(std::remove_if(m_calls.begin(), m_calls.end(),
+                                          [&calls](const Call &known) {
+                                              return std::none_of(calls.begin(), calls.end(),
+                                                                  [&known](const auto &call) {
+                                                                      return call.first
+                                                                              == known.path;
+                                                                  });
+                                          }),
+                           m_calls.end());
              for (const auto &call : calls)
                  addCall(call.first, call.second);
              publishCalls();
@@ -571,18 +580,22 @@ void OfonoPhone::onCallRemoved(const QDBusObjectPath &path, const QDBusMessage &
 
 void OfonoPhone::addCall(const QString &path, const QVariantMap &properties)
 {
-    Call call;
-    call.path = path;
+    // A call known already (the calls read again) keeps what was seen of it: rang in, answered,
+    // rejected.
+    auto known = std::find_if(m_calls.begin(), m_calls.end(),
+                              [&](const Call &call) { return call.path == path; });
+    if (known == m_calls.end()) {
+        Call call;
+        call.path = path;
+        known = m_calls.insert(m_calls.end(), call);
+    }
+    Call &call = *known;
     for (auto it = properties.cbegin(); it != properties.cend(); ++it)
         updateCall(call, it.key(), it.value());
-    call.incoming
-            = call.state == QLatin1String("incoming") || call.state == QLatin1String("waiting");
+    call.incoming = call.incoming || call.state == QLatin1String("incoming")
+            || call.state == QLatin1String("waiting");
     if (call.name.isEmpty() && m_lists)
         call.name = m_lists->contactName(call.number);
-    m_calls.erase(std::remove_if(m_calls.begin(), m_calls.end(),
-                                 [&](const Call &known) { return known.path == path; }),
-                  m_calls.end());
-    m_calls.append(call);
 }
 
 void OfonoPhone::updateCall(Call &call, const QString &name, const QVariant &value)
