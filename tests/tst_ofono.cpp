@@ -266,20 +266,13 @@ QDBusMessage tst_Ofono::mock(const QString &path, const QString &interface, cons
 QString tst_Ofono::callPath(const QString &number)
 {
     const QDBusMessage reply = mock(Modem, CallManager, QStringLiteral("GetCalls"));
-    const QDBusArgument calls = reply.arguments().value(0).value<QDBusArgument>();
-    QString path;
-    calls.beginArray();
-    while (!calls.atEnd()) {
-        QDBusObjectPath call;
-        QVariantMap properties;
-        calls.beginStructure();
-        calls >> call >> properties;
-        calls.endStructure();
-        if (properties.value(QStringLiteral("LineIdentification")).toString() == number)
-            path = call.path();
+    const auto calls
+            = qdbus_cast<QList<QPair<QDBusObjectPath, QVariantMap>>>(reply.arguments().value(0));
+    for (const auto &call : calls) {
+        if (call.second.value(QStringLiteral("LineIdentification")).toString() == number)
+            return call.first.path();
     }
-    calls.endArray();
-    return path;
+    return QString();
 }
 
 // Whether the mock's modem, or its call with that number, was called with the method.

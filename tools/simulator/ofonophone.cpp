@@ -256,23 +256,11 @@ void setPhone(const char *name, const QVariant &value)
 }
 
 // An a(oa{sv}) reply: each object's path and properties.
-QList<QPair<QString, QVariantMap>> objectsOf(const QDBusMessage &reply)
+using ObjectsWithProperties = QList<QPair<QDBusObjectPath, QVariantMap>>;
+
+ObjectsWithProperties objectsOf(const QDBusMessage &reply)
 {
-    QList<QPair<QString, QVariantMap>> objects;
-    const QDBusArgument argument = reply.arguments().value(0).value<QDBusArgument>();
-    if (argument.currentType() != QDBusArgument::ArrayType)
-        return objects;
-    argument.beginArray();
-    while (!argument.atEnd()) {
-        QDBusObjectPath path;
-        QVariantMap properties;
-        argument.beginStructure();
-        argument >> path >> properties;
-        argument.endStructure();
-        objects.append({path.path(), properties});
-    }
-    argument.endArray();
-    return objects;
+    return qdbus_cast<ObjectsWithProperties>(reply.arguments().value(0));
 }
 
 QVariantMap propertiesOf(const QDBusMessage &reply)
@@ -377,7 +365,7 @@ void OfonoPhone::requestModems()
                 m_modems.clear();
                 const auto modems = objectsOf(reply);
                 for (const auto &modem : modems)
-                    m_modems.append({modem.first, modem.second});
+                    m_modems.append({modem.first.path(), modem.second});
                 chooseModem();
             },
             [this](const QString &error) {
@@ -467,17 +455,16 @@ void OfonoPhone::readModem()
          [this](const QDBusMessage &reply) {
              // The calls of now: those gone meanwhile go, those known keep what was seen of them.
              const auto calls = objectsOf(reply);
+             QStringList paths;
+             for (const auto &call : calls)
+                 paths.append(call.first.path());
              m_calls.erase(std::remove_if(m_calls.begin(), m_calls.end(),
-                                          [&calls](const Call &known) {
-                                              return std::none_of(calls.begin(), calls.end(),
-                                                                  [&known](const auto &call) {
-                                                                      return call.first
-                                                                              == known.path;
-                                                                  });
+                                          [&paths](const Call &known) {
+                                              return !paths.contains(known.path);
                                           }),
                            m_calls.end());
              for (const auto &call : calls)
-                 addCall(call.first, call.second);
+                 addCall(call.first.path(), call.second);
              publishCalls();
          });
     call(m_modem, NetworkInterface, QStringLiteral("GetProperties"), {},
