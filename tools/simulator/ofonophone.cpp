@@ -338,22 +338,24 @@ void OfonoPhone::connectToBus()
     connect(m_watcher, &QDBusServiceWatcher::serviceUnregistered, this, &OfonoPhone::ofonoLeft);
 
     // oFono's signals, from whichever of its objects: the handlers keep those of the modem
-    // followed.
+    // followed. (The slots' signatures stay normalized.)
     const QString any;
+    // clang-format off
     m_bus.connect(Service, QStringLiteral("/"), ManagerInterface, QStringLiteral("ModemAdded"),
-                  this, SLOT(onModemAdded(QDBusObjectPath, QVariantMap)));
+                  this, SLOT(onModemAdded(QDBusObjectPath,QVariantMap)));
     m_bus.connect(Service, QStringLiteral("/"), ManagerInterface, QStringLiteral("ModemRemoved"),
                   this, SLOT(onModemRemoved(QDBusObjectPath)));
     for (const QString &interface :
          {ModemInterface, CallInterface, NetworkInterface, HandsfreeInterface})
         m_bus.connect(Service, any, interface, QStringLiteral("PropertyChanged"), this,
-                      SLOT(onPropertyChanged(QString, QDBusVariant, QDBusMessage)));
+                      SLOT(onPropertyChanged(QString,QDBusVariant,QDBusMessage)));
     m_bus.connect(Service, any, CallManagerInterface, QStringLiteral("CallAdded"), this,
-                  SLOT(onCallAdded(QDBusObjectPath, QVariantMap, QDBusMessage)));
+                  SLOT(onCallAdded(QDBusObjectPath,QVariantMap,QDBusMessage)));
     m_bus.connect(Service, any, CallManagerInterface, QStringLiteral("CallRemoved"), this,
-                  SLOT(onCallRemoved(QDBusObjectPath, QDBusMessage)));
+                  SLOT(onCallRemoved(QDBusObjectPath,QDBusMessage)));
     m_bus.connect(Service, any, MessagesInterface, QStringLiteral("IncomingMessage"), this,
-                  SLOT(onIncomingMessage(QString, QVariantMap, QDBusMessage)));
+                  SLOT(onIncomingMessage(QString,QVariantMap,QDBusMessage)));
+    // clang-format on
     requestModems();
 }
 
