@@ -294,6 +294,11 @@ OfonoPhone::OfonoPhone(const QString &busAddress, SimulatedPhone *lists, QObject
 
 OfonoPhone::~OfonoPhone()
 {
+    // The calls still waiting for an answer and the service watcher go while their connection
+    // is there: torn down after it, they raced the connection's own ending and corrupted the heap
+    // now and then.
+    qDeleteAll(findChildren<QDBusPendingCallWatcher *>(QString(), Qt::FindDirectChildrenOnly));
+    delete m_watcher;
     QDBusConnection::disconnectFromBus(ConnectionName);
 }
 
@@ -453,25 +458,22 @@ void OfonoPhone::chooseModem()
 
 void OfonoPhone::readModem()
 {
+    // What the modem says from here on is newer than the answers to these reads, which may come
+    // after it: an answer does not undo what was heard meanwhile.
+    m_heard.clear();
     call(m_modem, CallManagerInterface, QStringLiteral("GetCalls"), {},
          [this](const QDBusMessage &reply) {
-             // The calls of now: those gone meanwhile go, those known keep what was seen of them.
              const auto calls = objectsOf(reply);
-             QStringList paths;
-             for (const auto &call : calls)
-                 paths.append(call.first.path());
-             m_calls.erase(std::remove_if(m_calls.begin(), m_calls.end(),
-                                          [&paths](const Call &known) {
-                                              return !paths.contains(known.path);
-                                          }),
-                           m_calls.end());
-             for (const auto &call : calls)
-                 addCall(call.first.path(), call.second);
+             for (const auto &call : calls) {
+                 if (!m_heard.contains(call.first.path()))
+                     addCall(call.first.path(), call.second);
+             }
              publishCalls();
          });
     call(m_modem, NetworkInterface, QStringLiteral("GetProperties"), {},
          [this](const QDBusMessage &reply) {
-             setNetworkStatus(propertiesOf(reply).value(QStringLiteral("Status")).toString());
+             if (!m_heard.contains(NetworkInterface))
+                 setNetworkStatus(propertiesOf(reply).value(QStringLiteral("Status")).toString());
          });
     const auto modem = std::find_if(m_modems.cbegin(), m_modems.cend(),
                                     [this](const Modem &known) { return known.path == m_modem; });
@@ -481,7 +483,8 @@ void OfonoPhone::readModem()
                    .contains(HandsfreeInterface))
         call(m_modem, HandsfreeInterface, QStringLiteral("GetProperties"), {},
              [this](const QDBusMessage &reply) {
-                 setBattery(propertiesOf(reply).value(QStringLiteral("BatteryChargeLevel")));
+                 if (!m_heard.contains(HandsfreeInterface))
+                     setBattery(propertiesOf(reply).value(QStringLiteral("BatteryChargeLevel")));
              });
 }
 
@@ -539,6 +542,7 @@ void OfonoPhone::onPropertyChanged(const QString &name, const QDBusVariant &valu
     }
     if (!isFollowed(message))
         return;
+    m_heard.insert(interface == CallInterface ? message.path() : interface);
     if (interface == CallInterface) {
         for (Call &call : m_calls) {
             if (call.path == message.path())
@@ -557,14 +561,17 @@ void OfonoPhone::onCallAdded(const QDBusObjectPath &path, const QVariantMap &pro
 {
     if (!isFollowed(message))
         return;
+    m_heard.insert(path.path());
     addCall(path.path(), properties);
     publishCalls();
 }
 
 void OfonoPhone::onCallRemoved(const QDBusObjectPath &path, const QDBusMessage &message)
 {
-    if (isFollowed(message))
-        callGone(path.path());
+    if (!isFollowed(message))
+        return;
+    m_heard.insert(path.path());
+    callGone(path.path());
 }
 
 void OfonoPhone::addCall(const QString &path, const QVariantMap &properties)

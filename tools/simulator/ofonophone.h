@@ -3,6 +3,7 @@
 #include <QDBusConnection>
 #include <QList>
 #include <QObject>
+#include <QSet>
 #include <QString>
 #include <QVariantMap>
 
@@ -137,6 +138,8 @@ private:
     QString m_modem;
     QList<Call> m_calls; // in the order they came
     QString m_networkStatus;
+    // Calls (by path) and interfaces the modem spoke of since it was last read.
+    QSet<QString> m_heard;
     // Changes with the modem followed: replies to another's calls are dropped.
     int m_session = 0;
     bool m_connected = false;
