@@ -388,20 +388,23 @@ void OfonoPhone::ofonoLeft()
     dropModem(QStringLiteral("oFono left the bus"));
 }
 
-void OfonoPhone::onModemAdded(const QDBusObjectPath &path, const QVariantMap &properties)
+void OfonoPhone::forgetModem(const QString &path)
 {
     m_modems.erase(std::remove_if(m_modems.begin(), m_modems.end(),
-                                  [&](const Modem &modem) { return modem.path == path.path(); }),
+                                  [&path](const Modem &modem) { return modem.path == path; }),
                    m_modems.end());
+}
+
+void OfonoPhone::onModemAdded(const QDBusObjectPath &path, const QVariantMap &properties)
+{
+    forgetModem(path.path());
     m_modems.append({path.path(), properties});
     chooseModem();
 }
 
 void OfonoPhone::onModemRemoved(const QDBusObjectPath &path)
 {
-    m_modems.erase(std::remove_if(m_modems.begin(), m_modems.end(),
-                                  [&](const Modem &modem) { return modem.path == path.path(); }),
-                   m_modems.end());
+    forgetModem(path.path());
     if (path.path() == m_modem)
         dropModem(QStringLiteral("the modem %1 went away").arg(m_modem));
     chooseModem();
@@ -645,12 +648,8 @@ void OfonoPhone::publishCalls()
             ++connected;
             joined += call.multiparty ? 1 : 0;
         }
-        rows.append(
-                QVariantMap{{QStringLiteral("name"), call.name},
-                            {QStringLiteral("number"), call.number},
-                            {QStringLiteral("callState"), QLatin1String(mapping->callList)},
-                            {QStringLiteral("duration"),
-                             call.connectedAt < 0 ? 0 : int((nowMs() - call.connectedAt) / 1000)}});
+        rows.append(callListRow(call.name, call.number, QLatin1String(mapping->callList),
+                                call.connectedAt, nowMs()));
     }
     // Call status values of the bridge.
     const int status = dialling ? (connected > 0 ? 4 : 3)

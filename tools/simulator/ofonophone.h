@@ -11,7 +11,6 @@
 
 class QDBusMessage;
 class QDBusObjectPath;
-class QDBusPendingCall;
 class QDBusServiceWatcher;
 class QDBusVariant;
 class QTimer;
@@ -99,6 +98,7 @@ private:
 
     void connectToBus();
     void ofonoLeft();
+    void forgetModem(const QString &path);
     void requestModems();
     // Chooses the modem to follow from those known, and reads its calls, network and battery.
     void chooseModem();

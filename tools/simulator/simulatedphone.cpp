@@ -106,6 +106,15 @@ QString timeText(const QDateTime &time)
 
 } // namespace
 
+QVariantMap callListRow(const QString &name, const QString &number, const QString &state,
+                        qint64 connectedAt, qint64 now)
+{
+    return {{QStringLiteral("name"), name},
+            {QStringLiteral("number"), number},
+            {QStringLiteral("callState"), state},
+            {QStringLiteral("duration"), connectedAt < 0 ? 0 : int((now - connectedAt) / 1000)}};
+}
+
 SimulatedPhone::SimulatedPhone(VirtualEventDispatcher *clock, QObject *parent, CallCarrier carrier)
     : QObject(parent)
     , m_clock(clock)
@@ -445,11 +454,7 @@ void SimulatedPhone::publishCalls()
     bool connected = false;
     for (const Call &call : qAsConst(m_activeCalls)) {
         connected = connected || call.connectedAt >= 0;
-        rows.append(QVariantMap{{QStringLiteral("name"), call.who.name},
-                                {QStringLiteral("number"), call.who.number},
-                                {QStringLiteral("callState"), call.state},
-                                {QStringLiteral("duration"),
-                                 call.connectedAt < 0 ? 0 : int((now - call.connectedAt) / 1000)}});
+        rows.append(callListRow(call.who.name, call.who.number, call.state, call.connectedAt, now));
     }
     phone()->callList()->setRows(rows);
     if (!connected)

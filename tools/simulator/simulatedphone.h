@@ -5,6 +5,7 @@
 #include <QObject>
 #include <QString>
 #include <QVariantList>
+#include <QVariantMap>
 
 class QTimer;
 
@@ -15,6 +16,12 @@ struct JournalEntry;
 namespace Simulator {
 
 class VirtualEventDispatcher;
+
+// One row of the bridge's call list, as both phones publish it: who, the call's state as the list
+// has it ("incoming", "active", ...), and the seconds since it connected (`connectedAt` and `now`
+// in ms; a negative `connectedAt`: not connected yet).
+QVariantMap callListRow(const QString &name, const QString &number, const QString &state,
+                        qint64 connectedAt, qint64 now);
 
 // A plausible paired phone: it answers the module's bridge commands the way a phone does, later
 // and through the bridge's values and signals (accepting a call connects it, ending it drops the
